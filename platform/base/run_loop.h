@@ -1,0 +1,72 @@
+// The run loop: one thread, one mode, timers and sources.
+//
+// A pass fires each timer that is due once, in due order, and then serves one ready source, so that neither a
+// timer that is always overdue nor a port that is always full can starve the other. When a pass found nothing
+// to do the loop waits. What time it is, how to wait and how to sleep can be replaced: that is how a
+// rehearsal runs two hours in no time.
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <optional>
+
+#include "platform/base/object.h"
+
+namespace base {
+
+/// Nanoseconds on the clock of HostAbsoluteTime.
+using Nanoseconds = std::int64_t;
+
+/// The loop's idea of time; the default is CLOCK_BOOTTIME.
+struct TimeSource {
+  std::function<Nanoseconds()> now;
+  /// Called when nothing is ready and nothing is due; returns when that may have changed. `deadline` is when
+  /// the next timer is due, if there is one.
+  std::function<void(std::optional<Nanoseconds> deadline)> wait;
+  std::function<void(Nanoseconds duration)> sleep;
+};
+void setTimeSource(TimeSource source);
+
+/// The default wait: blocks until a source is ready or the deadline, on CLOCK_BOOTTIME, has come.
+void waitForSources(std::optional<Nanoseconds> deadline);
+
+/// A descriptor that polls as readable while a source on the loop has data waiting in the kernel.
+int runLoopDescriptor();
+
+/// Something that becomes readable.
+struct Source : HostObject {
+  static constexpr Kind kKind = Kind::Source;
+  Source(int descriptor, std::int32_t rank, std::function<void()> callback);
+  ~Source() override;
+
+  const int fd;
+  const std::int32_t order;
+  const std::function<void()> ready;
+  /// Where set: asked before each poll, true when the source has something to deliver whatever the descriptor
+  /// says.
+  std::function<bool()> prepare;
+  bool onLoop = false;
+};
+
+struct Timer final : HostObject {
+  static constexpr Kind kKind = Kind::Timer;
+  Timer(Nanoseconds firstFiring, Nanoseconds interval, HostTimerCallback function, void* data);
+
+  const Nanoseconds first;
+  const Nanoseconds period;
+  const HostTimerCallback callback;
+  void* const context;
+  /// Number of the firing that comes next, 0 the first.
+  std::int64_t firing = 0;
+  /// Ranks timers due at the same time.
+  const std::uint64_t created;
+  bool onLoop = false;
+};
+
+/// Told of every timer that goes on the loop (true) and leaves it (false).
+void setTimerObserver(std::function<void(const Timer& timer, bool started)> observer);
+
+/// Lets SIGTERM and SIGINT end the loop, as a terminate message does, and ignores SIGPIPE.
+void endLoopOnSignals();
+
+}  // namespace base
