@@ -1,0 +1,3 @@
+#include "daemon/lifecycle.h"
+
+int main() { return KVDMain(); }

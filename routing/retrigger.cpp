@@ -1,0 +1,5 @@
+#include "routing/retrigger.h"
+
+HostTimerRef sRetriggerTimer;
+
+void stopRetrigger() {}
