@@ -19,6 +19,13 @@ inline constexpr mach_msg_id_t kKVDSetScreenLockedID = 602;
 /// How long a send waits for room in the daemon's queue, in milliseconds.
 inline constexpr mach_msg_timeout_t kKVDSendTimeout = 5000;
 
+static_assert(offsetof(mach_msg_header_t, msgh_bits) == 0);
+static_assert(offsetof(mach_msg_header_t, msgh_size) == 4);
+static_assert(offsetof(mach_msg_header_t, msgh_remote_port) == 8);
+static_assert(offsetof(mach_msg_header_t, msgh_local_port) == 12);
+static_assert(offsetof(mach_msg_header_t, msgh_reserved) == 16);
+static_assert(offsetof(mach_msg_header_t, msgh_id) == 20);
+
 /// Asks the daemon to quit.
 struct kvd_terminate_request_t {
   mach_msg_header_t Head;
@@ -58,10 +65,3 @@ static_assert(sizeof(kvd_setscreenlocked_request_t) == 36);
 static_assert(offsetof(kvd_setscreenlocked_request_t, NDR) == 24);
 static_assert(offsetof(kvd_setscreenlocked_request_t, locked) == 32);
 static_assert(offsetof(kvd_setscreenlocked_request_t, lockedPad) == 33);
-
-static_assert(offsetof(mach_msg_header_t, msgh_bits) == 0);
-static_assert(offsetof(mach_msg_header_t, msgh_size) == 4);
-static_assert(offsetof(mach_msg_header_t, msgh_remote_port) == 8);
-static_assert(offsetof(mach_msg_header_t, msgh_local_port) == 12);
-static_assert(offsetof(mach_msg_header_t, msgh_reserved) == 16);
-static_assert(offsetof(mach_msg_header_t, msgh_id) == 20);
