@@ -1,0 +1,35 @@
+// What kvremote's command line asks for.
+#pragma once
+
+#include <chrono>
+#include <cstdint>
+#include <span>
+#include <stdexcept>
+#include <vector>
+
+namespace remote {
+
+enum class Action { ShowHelp, ShowVersion, ListButtons, SendButton, SetScreenLocked, Terminate };
+
+struct Arguments {
+  Action action = Action::ShowHelp;
+  /// SendButton: which one, and the values to send, in order.
+  std::uint16_t usagePage = 0;
+  std::uint16_t usage = 0;
+  std::uint16_t extra = 0;
+  std::vector<std::int32_t> values;
+  /// SendButton: how long to wait before each value but the first.
+  std::chrono::milliseconds hold{0};
+  /// SetScreenLocked: the new state.
+  bool locked = false;
+};
+
+/// What is wrong with a command line, as one line for its author.
+struct UsageError : std::runtime_error {
+  using std::runtime_error::runtime_error;
+};
+
+/// Reads a command line, without the program's name. Throws UsageError.
+Arguments parseArguments(std::span<const char* const> words);
+
+}  // namespace remote

@@ -1,0 +1,43 @@
+// The stubs, byte by byte on a little-endian machine.
+#include "remote/kvd_client.h"
+
+#include <gtest/gtest.h>
+
+#include "tests/remote/fake_mach.h"
+
+namespace {
+
+using Bytes = std::vector<std::uint8_t>;
+
+TEST(Client, SendsExactlyTheRequestAndReturnsTheResult) {
+  const struct {
+    mach_msg_id_t id;
+    std::function<mach_msg_return_t()> call;
+    Bytes body;
+  } cases[] = {
+      {600, [] { return kvd_terminate(kFakePort); }, {}},
+      {601,
+       [] { return kvd_handlehidevent(kFakePort, 0x000C, 0x01CD, 0xFFEE, -2); },
+       {0xA0, 0xA1, 0xA2, 0xA3, 0xA4, 0xA5, 0xA6, 0xA7,  // NDR
+        0x0C, 0x00, 0,    0,    0xCD, 0x01, 0,    0,     // page, usage
+        0xEE, 0xFF, 0,    0,    0xFE, 0xFF, 0xFF, 0xFF}},
+      {602,
+       [] { return kvd_setscreenlocked(kFakePort, 0x80); },
+       {0xA0, 0xA1, 0xA2, 0xA3, 0xA4, 0xA5, 0xA6, 0xA7, 0x80, 0, 0, 0}},
+  };
+  for (const auto& [id, call, body] : cases) {
+    for (const mach_msg_return_t result : {MACH_MSG_SUCCESS, MACH_SEND_TIMED_OUT, 0x7654321}) {
+      gSent.clear();
+      gSendResult = [result] { return result; };
+      EXPECT_EQ(call(), result);
+
+      const auto lowByte = static_cast<std::uint8_t>(id & 0xFF);
+      Bytes expected = {19, 0, 0, 0, 0, 0, 0, 0, 0x34,    0x12, 0, 0,
+                        0,  0, 0, 0, 0, 0, 0, 0, lowByte, 0x02, 0, 0};
+      expected.insert(expected.end(), body.begin(), body.end());
+      EXPECT_EQ(gSent, (std::vector<SentMessage>{{expected, 17, 0, 0, 5000, 0}})) << id;
+    }
+  }
+}
+
+}  // namespace
