@@ -3,11 +3,14 @@
 
 #include <gtest/gtest.h>
 
+#include <iterator>
+
 #include "tests/remote/fake_mach.h"
 
 namespace {
 
 using Bytes = std::vector<std::uint8_t>;
+using Arguments = std::vector<std::int64_t>;
 
 TEST(Client, SendsExactlyTheRequestAndReturnsTheResult) {
   const struct {
@@ -35,7 +38,9 @@ TEST(Client, SendsExactlyTheRequestAndReturnsTheResult) {
       Bytes expected = {19, 0, 0, 0, 0, 0, 0, 0, 0x34,    0x12, 0, 0,
                         0,  0, 0, 0, 0, 0, 0, 0, lowByte, 0x02, 0, 0};
       expected.insert(expected.end(), body.begin(), body.end());
-      EXPECT_EQ(gSent, (std::vector<SentMessage>{{expected, 17, 0, 0, 5000, 0}})) << id;
+      ASSERT_EQ(gSent.size(), 1U);
+      EXPECT_EQ(gSent[0].bytes, expected);
+      EXPECT_EQ(gSent[0].arguments, (Arguments{17, std::ssize(expected), 0, 0, 5000, 0}));
     }
   }
 }

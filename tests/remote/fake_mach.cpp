@@ -20,6 +20,7 @@ mach_msg_return_t mach_msg(mach_msg_header_t* message, mach_msg_option_t option,
                            mach_msg_size_t receive_size, mach_port_t receive_port, mach_msg_timeout_t timeout,
                            mach_port_t notify_port) {
   const auto* bytes = reinterpret_cast<const std::uint8_t*>(message);
-  gSent.push_back({{bytes, bytes + send_size}, option, receive_size, receive_port, timeout, notify_port});
+  gSent.push_back(
+      {{bytes, bytes + send_size}, {option, send_size, receive_size, receive_port, timeout, notify_port}});
   return gSendResult();
 }

@@ -10,12 +10,8 @@ inline constexpr mach_port_t kFakePort = 0x1234;
 
 struct SentMessage {
   std::vector<std::uint8_t> bytes;
-  mach_msg_option_t option;
-  mach_msg_size_t receiveSize;
-  mach_port_t receivePort;
-  mach_msg_timeout_t timeout;
-  mach_port_t notifyPort;
-  friend bool operator==(const SentMessage&, const SentMessage&) = default;
+  /// Option, send size, receive size, receive port, time-out, notify port.
+  std::vector<std::int64_t> arguments;
 };
 
 inline std::vector<SentMessage> gSent;
