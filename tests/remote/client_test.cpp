@@ -14,17 +14,17 @@ using Arguments = std::vector<std::int64_t>;
 
 TEST(Client, SendsExactlyTheRequestAndReturnsTheResult) {
   const struct {
-    mach_msg_id_t id;
+    std::uint8_t id;  // 600, 601, 602 less 0x200
     std::function<mach_msg_return_t()> call;
     Bytes body;
   } cases[] = {
-      {600, [] { return kvd_terminate(kFakePort); }, {}},
-      {601,
+      {0x58, [] { return kvd_terminate(kFakePort); }, {}},
+      {0x59,
        [] { return kvd_handlehidevent(kFakePort, 0x000C, 0x01CD, 0xFFEE, -2); },
        {0xA0, 0xA1, 0xA2, 0xA3, 0xA4, 0xA5, 0xA6, 0xA7,  // NDR
         0x0C, 0x00, 0,    0,    0xCD, 0x01, 0,    0,     // page, usage
         0xEE, 0xFF, 0,    0,    0xFE, 0xFF, 0xFF, 0xFF}},
-      {602,
+      {0x5A,
        [] { return kvd_setscreenlocked(kFakePort, 0x80); },
        {0xA0, 0xA1, 0xA2, 0xA3, 0xA4, 0xA5, 0xA6, 0xA7, 0x80, 0, 0, 0}},
   };
@@ -34,9 +34,7 @@ TEST(Client, SendsExactlyTheRequestAndReturnsTheResult) {
       gSendResult = [result] { return result; };
       EXPECT_EQ(call(), result);
 
-      const auto lowByte = static_cast<std::uint8_t>(id & 0xFF);
-      Bytes expected = {19, 0, 0, 0, 0, 0, 0, 0, 0x34,    0x12, 0, 0,
-                        0,  0, 0, 0, 0, 0, 0, 0, lowByte, 0x02, 0, 0};
+      Bytes expected = {19, 0, 0, 0, 0, 0, 0, 0, 0x34, 0x12, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, id, 0x02, 0, 0};
       expected.insert(expected.end(), body.begin(), body.end());
       ASSERT_EQ(gSent.size(), 1U);
       EXPECT_EQ(gSent[0].bytes, expected);
