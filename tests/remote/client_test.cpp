@@ -10,7 +10,6 @@
 namespace {
 
 using Bytes = std::vector<std::uint8_t>;
-using Arguments = std::vector<std::int64_t>;
 
 TEST(Client, SendsExactlyTheRequestAndReturnsTheResult) {
   const struct {
@@ -38,7 +37,7 @@ TEST(Client, SendsExactlyTheRequestAndReturnsTheResult) {
       expected.insert(expected.end(), body.begin(), body.end());
       ASSERT_EQ(gSent.size(), 1U);
       EXPECT_EQ(gSent[0].bytes, expected);
-      EXPECT_EQ(gSent[0].arguments, (Arguments{17, std::ssize(expected), 0, 0, 5000, 0}));
+      EXPECT_EQ(gSent[0].arguments, (std::vector<std::int64_t>{17, std::ssize(expected), 0, 0, 5000, 0}));
     }
   }
 }
