@@ -70,9 +70,8 @@ TEST(Command, ReadsTimes) {
 TEST(Command, RefusesBadLines) {
   std::istringstream lines(
       ";play menu;play --press --release;play --loud;unplay;play --hold;play --hold 0;play --hold 601s;"
-      "play --hold=nan;play --hold -1s;play --hold 1e2s;lock;lock maybe;quit now;list --press;--raw 1 2;"
-      "--raw 0x10000 2 1;--raw 1 -1 1;--raw 1 2 2147483648;--raw 1 2 --3;--raw 1 2 0x;--raw 1 2 1x;"
-      "--raw 1 2 99999999999999999999");
+      "play --hold=nan;play --hold 1e2s;lock maybe;quit now;list --press;--raw 1 2;--raw 0x10000 2 1;"
+      "--raw 1 -1 1;--raw 1 2 2147483648;--raw 1 2 --3;--raw 1 2 1x;--raw 1 2 99999999999999999999");
   for (std::string line; std::getline(lines, line, ';');) {
     EXPECT_THROW(parse(line), remote::UsageError) << line;
   }
