@@ -1,14 +1,11 @@
 #include "remote/arguments.h"
 
-#include <charconv>
-#include <cmath>
-#include <limits>
 #include <optional>
 #include <string>
 #include <string_view>
-#include <system_error>
 
 #include "remote/buttons.h"
+#include "remote/words.h"
 
 namespace remote {
 namespace {
@@ -24,62 +21,15 @@ struct Line {
   Words words;
 };
 
-constexpr std::chrono::milliseconds kShortestHold{1};
-constexpr std::chrono::milliseconds kLongestHold = std::chrono::minutes(10);
+constexpr std::chrono::minutes kLongestHold{10};
 
-std::string quoted(std::string_view word) { return "'" + std::string(word) + "'"; }
-
-std::string joined(const std::vector<std::string>& words) {
-  std::string result;
-  for (const std::string& word : words) result += (result.empty() ? "" : ", ") + word;
-  return result;
-}
-
-/// Reads a time such as 2s, 500ms, 1.5s or 1m; a bare number is seconds.
-std::chrono::milliseconds parseTime(std::string_view text) {
-  double number = 0;
-  const char* end = text.data() + text.size();
-  const auto [rest, error] = std::from_chars(text.data(), end, number, std::chars_format::fixed);
-  const std::string_view unit(rest, static_cast<std::size_t>(end - rest));
-  double milliseconds = std::numeric_limits<double>::quiet_NaN();
-  if (unit == "ms") milliseconds = number;
-  if (unit == "s" || unit.empty()) milliseconds = number * 1e3;
-  if (unit == "m") milliseconds = number * 60e3;
-  if (error != std::errc() || std::isnan(milliseconds)) {
-    throw UsageError("not a time: " + quoted(text) + " (2s, 500ms, 1.5s, 1m)");
-  }
-  if (milliseconds < static_cast<double>(kShortestHold.count()) ||
-      milliseconds > static_cast<double>(kLongestHold.count())) {
+std::chrono::milliseconds parseHold(std::string_view text) {
+  const std::chrono::nanoseconds time = parseTime(text);
+  const auto milliseconds = std::chrono::round<std::chrono::milliseconds>(time);
+  if (milliseconds.count() < 1 || time > kLongestHold) {
     throw UsageError("a button can be held for 1ms to 10m, not " + quoted(text));
   }
-  return std::chrono::milliseconds(std::llround(milliseconds));
-}
-
-/// Reads a decimal or 0x hexadecimal number that fits Integer.
-template <typename Integer>
-Integer parseNumber(std::string_view what, std::string_view text) {
-  std::string_view digits = text;
-  const bool negative = digits.starts_with('-');
-  if (negative) digits.remove_prefix(1);
-  const bool hexadecimal = digits.starts_with("0x") || digits.starts_with("0X");
-  if (hexadecimal) digits.remove_prefix(2);
-
-  // Read as an unsigned number, so that a second sign is an error.
-  std::uint64_t magnitude = 0;
-  const char* end = digits.data() + digits.size();
-  const auto [rest, error] = std::from_chars(digits.data(), end, magnitude, hexadecimal ? 16 : 10);
-  if (error == std::errc::invalid_argument || rest != end) {
-    throw UsageError("not a number for " + std::string(what) + ": " + quoted(text));
-  }
-  constexpr std::int64_t kLeast = std::numeric_limits<Integer>::min();
-  constexpr std::int64_t kMost = std::numeric_limits<Integer>::max();
-  const std::uint64_t largest = static_cast<std::uint64_t>(negative ? -kLeast : kMost);
-  if (error != std::errc() || magnitude > largest) {
-    throw UsageError(std::string(what) + " is " + std::to_string(kLeast) + " to " + std::to_string(kMost) +
-                     ", not " + std::string(text));
-  }
-  const auto number = static_cast<std::int64_t>(magnitude);
-  return static_cast<Integer>(negative ? -number : number);
+  return milliseconds;
 }
 
 bool isOption(std::string_view word) {
@@ -108,10 +58,10 @@ Line takeApart(std::span<const char* const> arguments) {
     } else if (word == "--hold") {
       setGesture(line, Gesture::Hold);
       if (++index == arguments.size()) throw UsageError("--hold needs a time, such as 2s");
-      line.hold = parseTime(arguments[index]);
+      line.hold = parseHold(arguments[index]);
     } else if (word.starts_with(kHoldEquals)) {
       setGesture(line, Gesture::Hold);
-      line.hold = parseTime(word.substr(kHoldEquals.size()));
+      line.hold = parseHold(word.substr(kHoldEquals.size()));
     } else {
       throw UsageError("unknown option " + quoted(word));
     }
@@ -133,14 +83,6 @@ Arguments parseRaw(const Words& words) {
   arguments.values = {parseNumber<std::int32_t>("the value", words[2])};
   if (words.size() == 4) arguments.extra = parseNumber<std::uint16_t>("the extra field", words[3]);
   return arguments;
-}
-
-const Button& knownButton(std::string_view name) {
-  if (const Button* button = findButton(name)) return *button;
-  const std::vector<std::string> nearest = nearestButtonNames(name);
-  throw UsageError(
-      "unknown button " + quoted(name) +
-      (nearest.empty() ? " ('kvremote list' shows them all)" : ", did you mean " + joined(nearest) + "?"));
 }
 
 Arguments parseButton(const Line& line) {

@@ -4,8 +4,9 @@
 #include <chrono>
 #include <cstdint>
 #include <span>
-#include <stdexcept>
 #include <vector>
+
+#include "remote/words.h"
 
 namespace remote {
 
@@ -22,11 +23,6 @@ struct Arguments {
   std::chrono::milliseconds hold{0};
   /// SetScreenLocked: the new state.
   bool locked = false;
-};
-
-/// What is wrong with a command line, as one line for its author.
-struct UsageError : std::runtime_error {
-  using std::runtime_error::runtime_error;
 };
 
 /// Reads a command line, without the program's name. Throws UsageError.

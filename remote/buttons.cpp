@@ -5,6 +5,8 @@
 #include <numeric>
 #include <utility>
 
+#include "remote/words.h"
+
 namespace remote {
 namespace {
 
@@ -87,6 +89,15 @@ const Button* findButton(std::string_view name) {
     return button.name == wanted || spelling(button.hidName) == wanted;
   });
   return found == kButtons.end() ? nullptr : found;
+}
+
+const Button& knownButton(std::string_view name) {
+  if (const Button* button = findButton(name)) return *button;
+  std::string nearest;
+  for (const std::string& near : nearestButtonNames(name)) nearest += (nearest.empty() ? "" : ", ") + near;
+  throw UsageError(
+      "unknown button " + quoted(name) +
+      (nearest.empty() ? " ('kvremote list' shows them all)" : ", did you mean " + nearest + "?"));
 }
 
 std::vector<std::string> nearestButtonNames(std::string_view name) {

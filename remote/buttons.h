@@ -30,6 +30,9 @@ std::span<const Button> buttons();
 /// ("play-pause", "Play/Pause"); null when there is none.
 const Button* findButton(std::string_view name);
 
+/// The same for a name that must be one; throws UsageError with the nearest names.
+const Button& knownButton(std::string_view name);
+
 /// At most three names close to one that findButton does not know, nearest first.
 std::vector<std::string> nearestButtonNames(std::string_view name);
 
