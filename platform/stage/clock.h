@@ -1,0 +1,26 @@
+// The rehearsal desktop's clock: virtual, or the machine's own.
+#pragma once
+
+#include "platform/base/run_loop.h"
+
+namespace stage {
+
+using base::Nanoseconds;
+
+inline constexpr Nanoseconds kSecond = 1'000'000'000;
+
+/// Where virtual time begins: a multiple of 600 s, so that the idle check falls on round times, and not zero,
+/// so that a date of zero is long past as it is on a real machine.
+inline constexpr Nanoseconds kVirtualStart = 86'400 * kSecond;
+
+/// Lets time move only when advanceTo says so.
+void useVirtualTime();
+bool timeIsVirtual();
+
+Nanoseconds now();
+/// Moves virtual time forward to `time`; never back, and not at all in real time.
+void advanceTo(Nanoseconds time);
+/// Lets so much time pass: at once in virtual time, by sleeping in real time.
+void pass(Nanoseconds duration);
+
+}  // namespace stage

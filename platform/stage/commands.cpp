@@ -1,0 +1,271 @@
+#include "platform/stage/commands.h"
+
+#include <algorithm>
+#include <span>
+#include <string>
+#include <type_traits>
+#include <vector>
+
+#include "platform/mach.h"
+#include "platform/stage/desktop.h"
+#include "platform/stage/director.h"
+#include "platform/stage/report.h"
+#include "platform/stage/script_world.h"
+#include "remote/buttons.h"
+#include "remote/kvd_client.h"
+#include "remote/kvd_messages.h"
+#include "remote/words.h"
+
+namespace stage {
+
+namespace {
+
+using remote::quoted;
+using remote::UsageError;
+
+/// The words behind a command's name, and the whole text behind it.
+struct Words {
+  std::vector<std::string> list;
+  std::string_view text;
+
+  const std::string& at(std::size_t index) const { return list.at(index); }
+  std::size_t size() const { return list.size(); }
+};
+
+struct Command {
+  std::string_view name;
+  std::string_view arguments;  ///< for people
+  std::string_view help;
+  std::size_t fewest;  ///< how many words it takes
+  std::size_t most;
+  bool needsDaemon;
+  void (*run)(const Words& words);
+};
+
+constexpr std::size_t kAnyNumber = static_cast<std::size_t>(-1);
+
+// ---- Messages ----
+
+/// Sends with one of the client stubs, and says so where that failed.
+template <typename... Fields>
+void send(mach_msg_return_t (*stub)(mach_port_t, Fields...), std::type_identity_t<Fields>... fields) {
+  mach_port_t bootstrap = MACH_PORT_NULL;
+  mach_port_t port = MACH_PORT_NULL;
+  kern_return_t result = task_get_special_port(mach_task_self(), TASK_BOOTSTRAP_PORT, &bootstrap);
+  if (daemonHasEnded()) result = BOOTSTRAP_UNKNOWN_SERVICE;
+  if (result == KERN_SUCCESS) result = bootstrap_look_up(bootstrap, kKVDServiceName, &port);
+  if (result == KERN_SUCCESS) result = stub(port, fields...);
+  if (result == MACH_SEND_TIMED_OUT) {
+    say("the daemon's queue stays full");
+  } else if (result != KERN_SUCCESS) {
+    say("nobody is listening");
+  }
+}
+
+void sendButton(const remote::Button& pressed, std::int32_t value) {
+  send(kvd_handlehidevent, pressed.usagePage, pressed.usage, 0, value);
+}
+
+void tap(const Words& words) {
+  const remote::Button& tapped = remote::knownButton(words.at(0));
+  for (const std::int32_t value : remote::tapValues(tapped)) sendButton(tapped, value);
+}
+
+void press(const Words& words) { sendButton(remote::knownButton(words.at(0)), remote::kPressed); }
+
+void release(const Words& words) { sendButton(remote::knownButton(words.at(0)), remote::kReleased); }
+
+void hold(const Words& words) {
+  const remote::Button& held = remote::knownButton(words.at(0));
+  const auto time = remote::parseTime(words.at(1));
+  sendButton(held, remote::kPressed);
+  waitThen(time.count(), [&held] { sendButton(held, remote::kReleased); });
+}
+
+void raw(const Words& words) {
+  const auto page = remote::parseNumber<std::uint16_t>("a usage page", words.at(0));
+  const auto usage = remote::parseNumber<std::uint16_t>("a usage", words.at(1));
+  const auto value = remote::parseNumber<std::int32_t>("a value", words.at(2));
+  const auto extra = words.size() > 3 ? remote::parseNumber<std::uint16_t>("an extra value", words.at(3)) : 0;
+  send(kvd_handlehidevent, page, usage, static_cast<std::uint16_t>(extra), value);
+}
+
+bool onOrOff(const std::string& word) {
+  if (word == "on") return true;
+  if (word == "off") return false;
+  throw UsageError("say on or off, not " + quoted(word));
+}
+
+void lock(const Words& words) { send(kvd_setscreenlocked, onOrOff(words.at(0)) ? 1 : 0); }
+
+void quitDaemon(const Words&) { terminateDaemon(); }
+
+// ---- The desktop ----
+
+Application& installed(const std::string& name) {
+  Application* const found = findApplication(name);
+  if (found == nullptr) throw UsageError("no application is called " + quoted(name));
+  return *found;
+}
+
+Application& running(const std::string& name) {
+  Application& found = installed(name);
+  if (!found.running()) throw UsageError(found.name + " does not run");
+  return found;
+}
+
+void open(const Words& words) {
+  Application* const found = findOrInstallApplication(words.at(0));
+  if (found == nullptr) throw UsageError("no application is called " + quoted(words.at(0)));
+  const bool again = words.size() > 1;
+  if (again && words.at(1) != "again")
+    throw UsageError("only 'again' can follow, not " + quoted(words.at(1)));
+  if (found->running() && !again)
+    throw UsageError(found->name + " runs already; 'again' starts it once more");
+  openApplication(*found);
+}
+
+void close(const Words& words) { quitApplication(running(words.at(0))); }
+
+void front(const Words& words) {
+  if (words.at(0) == "nobody") return clearFront();
+  bringToFront(running(words.at(0)));
+}
+
+void hang(const Words& words) {
+  Application& hung = running(words.at(0));
+  hung.hangsUntil = now() + remote::parseTime(words.at(1)).count();
+}
+
+void tell(const Words& words) {
+  Application& told = installed(words.at(0));
+  const std::size_t to = words.text.find(" to ");
+  if (to == std::string_view::npos || words.at(1) != "to") {
+    throw UsageError("say: tell " + words.at(0) + " to …");
+  }
+  const std::string statement(words.text.substr(to));
+  const tarnscript::Outcome outcome =
+      runScript("tell application id \"" + told.identifier + "\"" + statement);
+  if (outcome.error) throw UsageError(outcome.error->message);
+  const std::string answer = describe(outcome.value);
+  if (!answer.empty()) say("= " + answer);
+}
+
+void volume(const Words& words) {
+  const int wanted = remote::parseNumber<std::uint8_t>("an output volume", words.at(0));
+  if (wanted > 100) throw UsageError("an output volume is 0 to 100, not " + words.at(0));
+  setOutputVolume(wanted);
+}
+
+void mute(const Words& words) { setOutputMuted(onOrOff(words.at(0))); }
+
+void windowServer(const Words& words) { desktop().windowServerUp = onOrOff(words.at(0)); }
+
+void show(const Words&) {
+  for (const Process& process : desktop().running) {
+    const bool isFront = desktop().front && desktop().front->application == process.application;
+    const std::string state = process.application->describe();
+    say(process.application->name + (isFront ? " (in front)" : "") + (state.empty() ? "" : ": " + state));
+  }
+  say("output volume " + std::to_string(desktop().outputVolume) + (desktop().outputMuted ? ", muted" : ""));
+}
+
+// ---- The rehearsal ----
+
+void wait(const Words& words) { waitThen(remote::parseTime(words.at(0)).count(), nullptr); }
+
+void start(const Words&) {}
+
+void serveOthers(const Words&) { serve(); }
+
+void alive(const Words&) { say("alive: " + aliveText()); }
+
+void help(const Words&);
+
+// clang-format off
+constexpr Command kCommands[] = {
+    {"tap", "BUTTON", "what a remote sends for a short press", 1, 1, true, tap},
+    {"press", "BUTTON", "the press alone", 1, 1, true, press},
+    {"release", "BUTTON", "the release alone", 1, 1, true, release},
+    {"hold", "BUTTON TIME", "press, wait, release", 2, 2, true, hold},
+    {"raw", "PAGE USAGE VALUE [EXTRA]", "a button message by its numbers", 3, 4, true, raw},
+    {"lock", "on|off", "lock or unlock the screen", 1, 1, true, lock},
+    {"quit", "", "ask the daemon to end", 0, 0, true, quitDaemon},
+    {"open", "APP [again]", "start an application; any identifier with dots is one", 1, 2, false, open},
+    {"close", "APP", "end an application's oldest instance", 1, 1, false, close},
+    {"front", "APP|nobody", "bring an application to the front", 1, 1, false, front},
+    {"hang", "APP TIME", "let an application answer nobody for a time", 2, 2, false, hang},
+    {"tell", "APP to STATEMENT", "script an application yourself", 3, kAnyNumber, false, tell},
+    {"volume", "0…100", "set the output volume", 1, 1, false, volume},
+    {"mute", "on|off", "mute the output", 1, 1, false, mute},
+    {"window-server", "on|off", "whether the daemon finds a window server", 1, 1, false, windowServer},
+    {"show", "", "what runs, and how loud it is", 0, 0, false, show},
+    {"wait", "TIME", "let time pass (2h, 10m, 1.5s, 20ms)", 1, 1, true, wait},
+    {"start", "", "start the daemon, which else starts by itself", 0, 0, true, start},
+    {"serve", "", "answer other processes until the daemon ends", 0, 0, true, serveOthers},
+    {"alive", "", "count the host objects that are alive", 0, 0, false, alive},
+    {"help", "", "this list", 0, 0, false, help},
+};
+// clang-format on
+
+void help(const Words&) {
+  for (const Command& command : kCommands) {
+    std::string left = std::string(command.name) + " " + std::string(command.arguments);
+    left.resize(std::max<std::size_t>(left.size(), 32), ' ');
+    say(left + std::string(command.help));
+  }
+}
+
+const Command* findCommand(std::string_view name) {
+  const auto* const found = std::find_if(std::begin(kCommands), std::end(kCommands),
+                                         [&](const Command& command) { return command.name == name; });
+  return found != std::end(kCommands) ? found : nullptr;
+}
+
+Words split(std::string_view line) {
+  Words words;
+  constexpr std::string_view kBlanks = " \t\r";
+  for (std::size_t start = line.find_first_not_of(kBlanks); start != std::string_view::npos;) {
+    const std::size_t end = std::min(line.find_first_of(kBlanks, start), line.size());
+    words.list.emplace_back(line.substr(start, end - start));
+    start = line.find_first_not_of(kBlanks, end);
+  }
+  return words;
+}
+
+bool isComment(std::string_view line) {
+  const std::size_t start = line.find_first_not_of(" \t\r");
+  return start == std::string_view::npos || line[start] == '#';
+}
+
+}  // namespace
+
+std::optional<std::string> runCommand(std::string_view line) {
+  if (isComment(line)) return std::nullopt;
+  Words words = split(line);
+  words.text = line;
+  const std::string name = words.at(0);
+  words.list.erase(words.list.begin());
+  const Command* const command = findCommand(name);
+  if (command == nullptr) return "unknown command " + quoted(name);
+  if (words.size() < command->fewest || words.size() > command->most) {
+    return "usage: " + name + " " + std::string(command->arguments);
+  }
+  try {
+    command->run(words);
+    return std::nullopt;
+  } catch (const UsageError& error) {
+    return error.what();
+  }
+}
+
+bool needsDaemon(std::string_view line) {
+  if (isComment(line)) return false;
+  const Words words = split(line);
+  const Command* const command = findCommand(words.at(0));
+  return command != nullptr && command->needsDaemon;
+}
+
+void terminateDaemon() { send(kvd_terminate); }
+
+}  // namespace stage

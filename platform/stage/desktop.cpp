@@ -1,0 +1,134 @@
+#include "platform/stage/desktop.h"
+
+#include <strings.h>
+
+#include <algorithm>
+#include <string>
+
+#include "platform/stage/journal.h"
+#include "platform/stage/lyrabox.h"
+#include "platform/stage/script_world.h"
+
+namespace stage {
+
+namespace {
+
+bool sameProcess(const HostProcessSerialNumber& a, const HostProcessSerialNumber& b) {
+  return a.high == b.high && a.low == b.low;
+}
+
+bool equalIgnoringCase(std::string_view a, std::string_view b) {
+  return a.size() == b.size() && strncasecmp(a.data(), b.data(), a.size()) == 0;
+}
+
+}  // namespace
+
+Desktop& desktop() {
+  static Desktop instance;
+  return instance;
+}
+
+void setUpDesktop() {
+  desktop().installed.push_back(std::make_unique<Lyrabox>());
+  letScriptsFindApplications();
+}
+
+Application* findApplication(std::string_view identifierOrName) {
+  for (const auto& application : desktop().installed) {
+    if (application->identifier == identifierOrName || application->name == identifierOrName) {
+      return application.get();
+    }
+  }
+  for (const auto& application : desktop().installed) {
+    if (equalIgnoringCase(application->identifier, identifierOrName) ||
+        equalIgnoringCase(application->name, identifierOrName)) {
+      return application.get();
+    }
+  }
+  return nullptr;
+}
+
+Application* findOrInstallApplication(std::string_view identifierOrName) {
+  const std::size_t lastDot = identifierOrName.rfind('.');
+  const bool isIdentifier = lastDot != std::string_view::npos && lastDot + 1 < identifierOrName.size();
+  // Identifiers that differ in case alone are different applications to the desktop, whatever scripts make of
+  // them.
+  for (const auto& application : desktop().installed) {
+    if (application->identifier == identifierOrName) return application.get();
+  }
+  if (!isIdentifier) return findApplication(identifierOrName);
+  desktop().installed.push_back(std::make_unique<Application>(
+      std::string(identifierOrName), std::string(identifierOrName.substr(lastDot + 1)), "1.0"));
+  return desktop().installed.back().get();
+}
+
+const Process* findProcess(const HostProcessSerialNumber& serialNumber) {
+  const auto& running = desktop().running;
+  const auto found = std::find_if(running.begin(), running.end(), [&](const Process& process) {
+    return sameProcess(process.serialNumber, serialNumber);
+  });
+  return found != running.end() ? &*found : nullptr;
+}
+
+void openApplication(Application& application) {
+  static std::uint32_t sLastProcess = 0x1000;
+  const Process process{{0, ++sLastProcess}, &application};
+  desktop().running.push_back(process);
+  ++desktop().applicationListSeed;
+  const bool first = application.instances.empty();
+  application.instances.push_back(process.serialNumber);
+  record(Entry::Change, application.name + (first ? " starts" : " starts once more"));
+  if (first) application.started();
+}
+
+void quitApplication(Application& application) {
+  if (application.instances.empty()) return;
+  const HostProcessSerialNumber oldest = application.instances.front();
+  application.instances.erase(application.instances.begin());
+  std::erase_if(desktop().running,
+                [&](const Process& process) { return sameProcess(process.serialNumber, oldest); });
+  ++desktop().applicationListSeed;
+  record(Entry::Change, application.name + " quits");
+  if (desktop().front && sameProcess(desktop().front->serialNumber, oldest)) desktop().front.reset();
+  if (application.instances.empty()) application.ended();
+}
+
+void bringToFront(Application& application) {
+  if (application.instances.empty()) return;
+  const HostProcessSerialNumber oldest = application.instances.front();
+  if (desktop().front && sameProcess(desktop().front->serialNumber, oldest)) return;
+  desktop().front = Process{oldest, &application};
+  record(Entry::Change, application.name + " comes to the front");
+}
+
+void clearFront() { desktop().front.reset(); }
+
+void setOutputVolume(int volume) {
+  const int previous = desktop().outputVolume;
+  desktop().outputVolume = std::clamp(volume, 0, 100);
+  if (desktop().outputVolume != previous) {
+    record(Entry::Change,
+           "output volume " + std::to_string(previous) + " → " + std::to_string(desktop().outputVolume));
+  }
+}
+
+void setOutputMuted(bool muted) {
+  if (desktop().outputMuted == muted) return;
+  desktop().outputMuted = muted;
+  record(Entry::Change, muted ? "output muted" : "output no longer muted");
+}
+
+std::optional<Nanoseconds> nextDesktopChange() {
+  std::optional<Nanoseconds> next;
+  for (const auto& application : desktop().installed) {
+    const std::optional<Nanoseconds> change = application->nextChange();
+    if (change && (!next || *change < *next)) next = change;
+  }
+  return next;
+}
+
+void advanceDesktop() {
+  for (const auto& application : desktop().installed) application->advance();
+}
+
+}  // namespace stage

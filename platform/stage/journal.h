@@ -1,0 +1,43 @@
+// The journal: every observable thing that happens on the rehearsal desktop, in order.
+#pragma once
+
+#include <functional>
+#include <string>
+
+#include "platform/stage/clock.h"
+
+namespace stage {
+
+enum class Entry {
+  Question,      ///< something the daemon asked
+  Script,        ///< a script, with what it answered
+  Answer,        ///< what a script answered, where other things happened in between
+  Event,         ///< an inter-application event
+  Key,           ///< a key posted to a process
+  SoundKey,      ///< a sound key posted to the window server
+  Notification,  ///< a distributed notification
+  Change,        ///< something changed in an application or on the desktop
+  Timer,         ///< a timer started or stopped
+  Service,       ///< a setting of the window server or the service manager
+  Exit,          ///< the daemon ended
+};
+
+struct JournalLine {
+  Entry kind;
+  std::string text;
+  Nanoseconds time;
+};
+
+/// Writes one line.
+void record(Entry kind, std::string text);
+
+/// Writes that a script runs; what it answered follows with recordScriptEnd, on the same line if nothing else
+/// happened in between.
+void recordScriptStart(const std::string& source);
+/// An empty answer is none.
+void recordScriptEnd(const std::string& answer);
+
+/// Where the lines go, one listener at a time.
+void setJournalListener(std::function<void(const JournalLine& line)> listener);
+
+}  // namespace stage

@@ -1,0 +1,43 @@
+#include <unistd.h>
+
+#include <cstdio>
+#include <iostream>
+#include <string_view>
+
+#include "platform/stage/desktop.h"
+#include "platform/stage/director.h"
+
+namespace {
+
+constexpr char kHelp[] =
+    "Usage: kvd-stage\n"
+    "\n"
+    "Runs kvd on the rehearsal desktop: model applications in memory, a real service port.\n"
+    "\n"
+    "With a terminal it runs in real time and takes commands; other processes reach it with kvremote.\n"
+    "Without one it reads commands from standard input and writes a transcript in virtual time. Lines\n"
+    "that begin with a blank are passed over, so that a transcript can be played again.\n"
+    "The command 'help' lists the commands.\n"
+    "\n"
+    "Exit status: 0, 1 when a command was unknown or wrong, 2 for a bad command line.\n";
+
+}  // namespace
+
+int main(int argc, char** argv) {
+  if (argc > 1) {
+    const std::string_view option = argv[1];
+    if (argc == 2 && option == "--help") {
+      std::fputs(kHelp, stdout);
+      return 0;
+    }
+    if (argc == 2 && option == "--version") {
+      std::puts("kvd-stage " KVD_VERSION);
+      return 0;
+    }
+    std::fputs("Usage: kvd-stage [--help | --version]\n", stderr);
+    return 2;
+  }
+  stage::setUpDesktop();
+  const bool live = isatty(STDIN_FILENO) != 0 && isatty(STDOUT_FILENO) != 0;
+  return live ? stage::playLive(std::cout) : stage::playTranscript(STDIN_FILENO, std::cout);
+}
