@@ -8,8 +8,8 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <memory>
 #include <string_view>
-#include <utility>
 
 #include "platform/host.h"
 
@@ -71,6 +71,19 @@ T* as(HostObject* object) {
 template <typename T, typename Kind>
 T* as(HostHandle<Kind> handle) {
   return as<T>(handle.object);
+}
+
+struct Releaser {
+  void operator()(HostObject* object) const { HostRelease(object); }
+};
+/// One reference, dropped when the pointer goes.
+template <typename T>
+using Owned = std::unique_ptr<T, Releaser>;
+/// A further reference to the object.
+template <typename T>
+Owned<T> retained(T* object) {
+  HostRetain(object);
+  return Owned<T>(object);
 }
 
 /// Gives one reference to the innermost open release scope; without an open scope the object stays with the
