@@ -4,6 +4,9 @@
 // timer that is always overdue nor a port that is always full can starve the other. When a pass found nothing
 // to do the loop waits. What time it is, how to wait and how to sleep can be replaced: that is how a
 // rehearsal runs two hours in no time.
+//
+// The loop keeps one reference to each timer and source that is on it. A stop ends the run in progress;
+// without one it does nothing.
 #pragma once
 
 #include <cstdint>
@@ -17,8 +20,9 @@ namespace base {
 /// Nanoseconds on the clock of HostAbsoluteTime.
 using Nanoseconds = std::int64_t;
 
-/// The loop's idea of time; the default is CLOCK_BOOTTIME.
+/// The loop's idea of time; the default, for each member that is empty too, is CLOCK_BOOTTIME.
 struct TimeSource {
+  /// Never goes back and stays below 73 years.
   std::function<Nanoseconds()> now;
   /// Called when nothing is ready and nothing is due; returns when that may have changed. `deadline` is when
   /// the next timer is due, if there is one.
@@ -33,23 +37,33 @@ void waitForSources(std::optional<Nanoseconds> deadline);
 /// A descriptor that polls as readable while a source on the loop has data waiting in the kernel.
 int runLoopDescriptor();
 
-/// Something that becomes readable.
+/// Something that becomes readable. The descriptor stays with whoever made the source, must be one that epoll
+/// takes and can stand behind one source on the loop at a time; otherwise the source does not go on.
 struct Source : HostObject {
   static constexpr Kind kKind = Kind::Source;
   Source(int descriptor, std::int32_t rank, std::function<void()> callback);
-  ~Source() override;
 
   const int fd;
   const std::int32_t order;
   const std::function<void()> ready;
   /// Where set: asked before each poll, true when the source has something to deliver whatever the descriptor
-  /// says.
+  /// says. It must not add or remove sources.
   std::function<bool()> prepare;
   bool onLoop = false;
+  /// When it was last served, as a running number: sources of equal order take turns by it.
+  std::uint64_t served = 0;
 };
 
+/// The shortest time between two firings; shorter intervals are held at it, so that no timer spins the loop.
+inline constexpr Nanoseconds kShortestPeriod = 1'000'000;
+/// The farthest from zero that a first firing or an interval may be, 73 years: sums of them stay in range.
+inline constexpr Nanoseconds kFarthest = Nanoseconds{1} << 61;
+
+/// Fires at first + n × period. What was missed is dropped: a late timer fires once, and comes next at the
+/// first scheduled time still ahead when that firing began.
 struct Timer final : HostObject {
   static constexpr Kind kKind = Kind::Timer;
+  /// Both times are held within the bounds above.
   Timer(Nanoseconds firstFiring, Nanoseconds interval, HostTimerCallback function, void* data);
 
   const Nanoseconds first;
@@ -61,12 +75,19 @@ struct Timer final : HostObject {
   /// Ranks timers due at the same time.
   const std::uint64_t created;
   bool onLoop = false;
+  /// Off the loop for ever.
+  bool invalidated = false;
 };
 
 /// Told of every timer that goes on the loop (true) and leaves it (false).
 void setTimerObserver(std::function<void(const Timer& timer, bool started)> observer);
 
-/// Lets SIGTERM and SIGINT end the loop, as a terminate message does, and ignores SIGPIPE.
+/// Lets SIGTERM and SIGINT end the loop, as a terminate message does, and ignores SIGPIPE. A signal that
+/// comes after this call and before the run ends the run in its first pass. Both are blocked from here on,
+/// which programs started by this process inherit unless their starter undoes it.
 void endLoopOnSignals();
+
+/// Whether such a signal has come.
+bool endedBySignal();
 
 }  // namespace base

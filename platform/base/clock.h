@@ -1,0 +1,11 @@
+// The time that the loop goes by.
+#pragma once
+
+#include "platform/base/run_loop.h"
+
+namespace base {
+
+/// The time source in force; every member is set.
+const TimeSource& timeSource();
+
+}  // namespace base
