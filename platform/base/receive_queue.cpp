@@ -1,0 +1,80 @@
+#include "platform/base/receive_queue.h"
+
+#include <sys/socket.h>
+#include <unistd.h>
+
+#include <array>
+#include <cstring>
+#include <map>
+
+#include "platform/base/port_names.h"
+
+namespace base {
+namespace {
+
+/// Port objects point into it, so its entries stay where they are.
+std::map<mach_port_t, ReceiveQueue>& queues() {
+  static auto& all = *new std::map<mach_port_t, ReceiveQueue>;
+  return all;
+}
+
+bool isTrusted(msghdr& datagram) {
+  const cmsghdr* control = CMSG_FIRSTHDR(&datagram);
+  if ((datagram.msg_flags & MSG_TRUNC) != 0 || control == nullptr) return false;
+  if (control->cmsg_level != SOL_SOCKET || control->cmsg_type != SCM_CREDENTIALS) return false;
+  ucred sender{};
+  std::memcpy(&sender, CMSG_DATA(control), sizeof sender);
+  return sender.uid == geteuid() || sender.uid == 0;
+}
+
+std::optional<Datagram> receive(int socket) {
+  const ssize_t length = recv(socket, nullptr, 0, MSG_PEEK | MSG_TRUNC | MSG_DONTWAIT);
+  if (length < 0) return std::nullopt;
+  Datagram received{.bytes = std::vector<std::byte>(static_cast<std::size_t>(length))};
+  iovec body{.iov_base = received.bytes.data(), .iov_len = received.bytes.size()};
+  // Room for the credentials, which come first, and for nothing else: descriptors that somebody attached do
+  // not fit, and the kernel closes them.
+  alignas(cmsghdr) std::array<char, CMSG_SPACE(sizeof(ucred))> control{};
+  msghdr datagram{};
+  datagram.msg_iov = &body;
+  datagram.msg_iovlen = 1;
+  datagram.msg_control = control.data();
+  datagram.msg_controllen = control.size();
+  if (recvmsg(socket, &datagram, MSG_DONTWAIT | MSG_CMSG_CLOEXEC) < 0) return std::nullopt;
+  received.trusted = isTrusted(datagram);
+  return received;
+}
+
+}  // namespace
+
+ReceiveQueue::ReceiveQueue(FileDescriptor socket) : socket_(std::move(socket)), owner_(getpid()) {}
+
+bool ReceiveQueue::isOurs() const { return owner_ == getpid(); }
+
+std::optional<Datagram> ReceiveQueue::take() {
+  if (readAhead_.empty()) return receive(socket_.get());
+  Datagram oldest = std::move(readAhead_.front());
+  readAhead_.pop_front();
+  return oldest;
+}
+
+bool ReceiveQueue::drain() {
+  const std::size_t before = readAhead_.size();
+  while (auto datagram = receive(socket_.get())) readAhead_.push_back(std::move(*datagram));
+  return readAhead_.size() > before;
+}
+
+ReceiveQueue* receiveQueue(mach_port_t name) {
+  const auto found = queues().find(name);
+  return found != queues().end() && found->second.isOurs() ? &found->second : nullptr;
+}
+
+void openReceiveQueue(mach_port_t name, FileDescriptor socket) {
+  queues().insert_or_assign(name, ReceiveQueue(std::move(socket)));
+  makeRoom = [](mach_port_t port) {
+    ReceiveQueue* own = receiveQueue(port);
+    return own != nullptr && own->drain();
+  };
+}
+
+}  // namespace base
