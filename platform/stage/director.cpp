@@ -204,7 +204,7 @@ int playTranscript(int input, std::ostream& output) {
     do {
       while (sWaitUntil) moveTime(std::nullopt);
     } while (!sInputEnded && !base::endedBySignal() && performNextCommand(false));
-    say("left alive: " + aliveText());
+    addLine("left alive: " + aliveText(), sCommandStart);
   }
   writeLines();
   setJournalListener(nullptr);

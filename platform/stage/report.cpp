@@ -10,8 +10,7 @@ std::string aliveText() {
   for (std::size_t i = 0; i < counts.size(); ++i) {
     if (counts[i] == 0) continue;
     if (!text.empty()) text += ", ";
-    text += std::to_string(counts[i]) + " " + std::string(base::kindName(static_cast<base::Kind>(i)));
-    if (counts[i] > 1) text += "s";
+    text += std::string(base::kindName(static_cast<base::Kind>(i))) + " ×" + std::to_string(counts[i]);
   }
   return text.empty() ? "nothing" : text;
 }

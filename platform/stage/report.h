@@ -5,7 +5,7 @@
 
 namespace stage {
 
-/// The objects that are alive, by kind: "2 serial numbers, 1 list"; "nothing" where there are none.
+/// The objects that are alive, by kind: "list ×1, serial number ×2"; "nothing" where there are none.
 std::string aliveText();
 
 }  // namespace stage

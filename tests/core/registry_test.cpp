@@ -1,0 +1,199 @@
+// The registry and the bridge on the rehearsal desktop.
+
+#include "registry/registry.h"
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <fstream>
+
+#include "platform/base/values.h"
+#include "platform/stage/desktop.h"
+#include "platform/stage/report.h"
+#include "registry/bridge.h"
+#include "tests/core/rehearsal.h"
+
+namespace {
+
+constexpr const char* kIdentifiers[] = {
+    Bundle::Lyrabox,        Bundle::Snapvale,        Bundle::Lumbra,    Bundle::Spindle,
+    Bundle::VistremePlayer, Bundle::VistremePlayerX, Bundle::Slidewell, Bundle::Daemon,
+};
+
+/// One mark an application: R when it runs, s when only its slot is filled, - otherwise.
+std::string slots() {
+  bool (*const kRunning[])() = {LyraboxIsRunning,   SnapvaleIsRunning,       LumbraIsRunning,
+                                SpindleIsRunning,   VistremePlayerIsRunning, VistremePlayerXIsRunning,
+                                SlidewellIsRunning, DaemonIsRunning};
+  std::string marks;
+  for (std::size_t i = 0; i < std::size(kIdentifiers); ++i) {
+    const bool filled(getASNForBundleID(HostGetConstantString(kIdentifiers[i])));
+    marks += kRunning[i]() ? "R" : filled ? "s" : "-";
+  }
+  return marks;
+}
+
+TEST(Registry, KnowsWhatRanAtTheLastRefresh) {
+  EXPECT_EQ(inChild([] {
+              std::string marks = slots() + " ";
+              for (const char* identifier : kIdentifiers) set(std::string("open ") + identifier);
+              marks += slots() + " ";
+              refreshCachedASNs();
+              marks += slots() + " ";
+              set("close com.tarn.Spindle; close com.tarn.vistremeplayer");
+              marks += slots() + " ";
+              refreshCachedASNs();
+              marks += slots() + " ";
+              marks += getASNForBundleID(HostGetConstantString("com.tarn.spindle")) ? "?" : "no ";
+              return marks + stage::aliveText();
+            }),
+            "-------- -------- RRRRRRRR RRRssRRR RRR--RRR no serial number ×6");
+}
+
+TEST(Registry, TakesTheFirstOfSeveralInstances) {
+  EXPECT_EQ(inChild([] {
+              set("open lyrabox; open lyrabox again");
+              refreshCachedASNs();
+              const auto instance = [] {
+                const HostSerialNumberRef cached = getASNForBundleID(HostGetConstantString(Bundle::Lyrabox));
+                return base::as<base::SerialNumber>(cached)->process.low & 0xF;
+              };
+              std::string answers = std::to_string(instance());
+              set("close lyrabox");
+              answers += LyraboxIsRunning() ? "R" : "s";
+              refreshCachedASNs();
+              return answers + std::to_string(instance()) + (LyraboxIsRunning() ? "R" : "s");
+            }),
+            "1s2R");
+}
+
+TEST(Registry, TellsTheFrontmostApplication) {
+  const std::pair<const char*, const char*> rows[] = {
+      {Bundle::Lyrabox, "Lyra"},   {Bundle::Snapvale, "Snap"},        {Bundle::Lumbra, "Lumb"},
+      {Bundle::Spindle, "Spin"},   {Bundle::VistremePlayerX, "VstX"}, {Bundle::VistremePlayer, "Vist"},
+      {Bundle::Slidewell, "Slid"}, {Bundle::Daemon, "none"},          {"com.tarn.lumbra", "none"},
+  };
+  for (const auto& [identifier, code] : rows) {
+    EXPECT_EQ(inChild([&] {
+                const std::string nobody = text(FrontProcessID());
+                set(std::string("open ") + identifier + "; front " + identifier);
+                return nobody + " " + text(FrontProcessID()) + " " + stage::aliveText();
+              }),
+              "none " + std::string(code) + " nothing");
+  }
+}
+
+TEST(Registry, ReadsTheMajorVersion) {
+  const std::pair<const char*, std::int32_t> rows[] = {
+      {"8.1.2", 8},     {"7", 7},     {"9", 9},
+      {"", 0},          {".5", 0},    {"beta", 0},
+      {"12beta.1", 12}, {"-3.1", -3}, {"99999999999.0", 2147483647},
+  };
+  for (const auto& [version, major] : rows) {
+    EXPECT_EQ(inChild([&] {
+                const std::int32_t absent = getSnapvaleVersion();
+                stage::desktop().installed.push_back(
+                    std::make_unique<stage::Application>(Bundle::Snapvale, "Snapvale", version));
+                set("open snapvale");
+                const std::string answer =
+                    std::to_string(absent) + " " + std::to_string(getSnapvaleVersion());
+                return answer + " " + stage::aliveText().substr(0, 5);
+              }).substr(0, 2 + std::to_string(major).size()),
+              "0 " + std::to_string(major));
+  }
+  // The copy of the serial number and the pieces of the version stay, on purpose; the information does not.
+  EXPECT_EQ(inChild([] {
+              set("open com.tarn.Snapvale");
+              getSnapvaleVersion();
+              return stage::aliveText();
+            }),
+            "string ×2, list ×1, serial number ×1");
+}
+
+TEST(Registry, ReadsAPropertyListFromABundle) {
+  EXPECT_EQ(inChild([] {
+              const auto directory =
+                  std::filesystem::temp_directory_path() / ("kvd-bundle-" + std::to_string(getpid()));
+              std::filesystem::create_directories(directory);
+              std::ofstream(directory / "Good.plist") << "<plist version=\"1.0\"><dict><key>k</key>"
+                                                         "<string>v</string></dict></plist>";
+              std::ofstream(directory / "Bad.plist") << "<plist><dict>";
+              const HostBundleRef bundle = HostCreateBundle(directory.c_str());
+              std::string answers;
+              for (const char* name : {"Good", "Bad", "Missing"}) {
+                const HostDictionaryRef list = CreateDictionaryFromPList(bundle, HostGetConstantString(name));
+                answers +=
+                    list
+                        ? base::textOf(HostAsString(HostDictionaryGetValue(list, HostGetConstantString("k"))))
+                        : std::string("-");
+                HostRelease(list);
+              }
+              HostRelease(bundle);
+              std::filesystem::remove_all(directory);
+              return answers + " " + stage::aliveText();
+            }),
+            "v-- nothing");
+}
+
+TEST(Bridge, TurnsResultsIntoNumbersAndCodes) {
+  struct Row {
+    const char* source;
+    std::intptr_t integer;
+    const char* code;
+  };
+  const std::string none(4, '.');
+  const Row rows[] = {
+      {nullptr, 0, "...."},
+      {"", 0, "...."},
+      {"\xFF\xFE", 0, "...."},
+      {"true", 1, "...."},
+      {"1 = 2", 0, "...."},
+      {"-7", -7, "...."},
+      {"7 / 2", 3, "...."},
+      {"-7 / 2", -3, "...."},
+      {"if then", 0, "...."},
+      {"neverSet + 1", 0, "...."},
+      {"tell application id \"com.tarn.Lyrabox\" to get player state", 0, "kPSS"},
+      {"tell application id \"com.tarn.Lyrabox\" to get sound volume", 60, "...."},
+      {"tell application id \"com.tarn.Nobody\" to launch", 0, "...."},
+  };
+  for (const Row& row : rows) {
+    EXPECT_EQ(inChild([&] {
+                set("open lyrabox");
+                HandleScript(row.source);
+                return std::to_string(HandleScriptWithIntegerResult(row.source)) + " " +
+                       text(HandleScriptWithOSTypeResult(row.source)) + " " + stage::aliveText();
+              }),
+              std::to_string(row.integer) + " " + row.code + " nothing")
+        << (row.source != nullptr ? row.source : "null");
+  }
+  EXPECT_EQ(inChild([] {
+              const HostDescriptorRef result = HandleScriptWithResult("42");
+              const std::string alive = stage::aliveText();
+              HostRelease(result);
+              return alive + ", then " + stage::aliveText();
+            }),
+            "descriptor ×1, then nothing");
+}
+
+TEST(Bridge, SendsEventsToCachedInstancesOnly) {
+  const auto eventTo = [](const char* identifier) {
+    HandleTarnEventWithCode(HostGetConstantString(identifier), FourCC("hook"), FourCC("RSel"));
+    return sent() + "|";
+  };
+  EXPECT_EQ(inChild([&] {
+              set("open lyrabox; open com.example.Editor");
+              std::string answers = eventTo(Bundle::Lyrabox);
+              refreshCachedASNs();
+              answers += eventTo(Bundle::Lyrabox);
+              answers += eventTo("com.example.Editor");
+              answers += stage::aliveText() + "|";
+              set("close lyrabox");
+              answers += eventTo(Bundle::Lyrabox);
+              return answers + stage::aliveText();
+            }),
+            "|event 'hook'/'RSel' to Lyrabox; ||serial number ×1||serial number ×1, event contents ×2")
+      << "what a failed send leaves behind stays, on purpose";
+}
+
+}  // namespace

@@ -1,0 +1,214 @@
+// Which application gets a button, and what the dispatcher makes of it.
+
+#include <gtest/gtest.h>
+
+#include <map>
+#include <set>
+
+#include "adapters/lyrabox.h"
+#include "registry/registry.h"
+#include "remote/buttons.h"
+#include "routing/dispatcher.h"
+#include "routing/target.h"
+#include "tests/core/rehearsal.h"
+
+namespace {
+
+/// One event: what is done on the desktop before it, and the target that it then has.
+struct Step {
+  const char* before;
+  const char* target;
+};
+
+std::string targetsAfter(const std::vector<Step>& steps) {
+  return inChild([&] {
+    std::string targets;
+    for (const Step& step : steps) {
+      set(step.before);
+      refreshCachedASNs();
+      sTargetApplication = App::Nval;
+      targets += text(targetApplication()) + " ";
+    }
+    return targets;
+  });
+}
+
+TEST(Target, IsFrontmostElsePlayingElseLastElseFirst) {
+  const std::vector<std::vector<Step>> rows = {
+      {{"", "none"}},
+      {{"open com.example.Editor; front com.example.Editor", "none"}},
+      {{"open lyrabox; open com.tarn.Snapvale; front com.tarn.Snapvale", "Snap"}},
+      {{"open com.tarn.Lumbra; front com.tarn.Lumbra", "Lumb"}},
+      {{"open com.tarn.Spindle; front com.tarn.Spindle", "Spin"}},
+      {{"open com.tarn.vistremeplayer; front com.tarn.vistremeplayer", "Vist"}},
+      {{"open com.tarn.VistremePlayerX; front com.tarn.VistremePlayerX", "VstX"}},
+      {{"open com.tarn.Officra.Slidewell; front com.tarn.Officra.Slidewell", "Slid"}},
+      // The same letters in another case name another application.
+      {{"open com.tarn.lyrabox; front com.tarn.lyrabox", "none"}},
+      {{"open com.tarn.VistremePlayer; front com.tarn.VistremePlayer", "none"}},
+      // Merely running counts last, in the order of priority; photo and slide applications never do.
+      {{"open com.tarn.vistremeplayer", "Vist"},
+       {"open com.tarn.VistremePlayerX", "VstX"},
+       {"open com.tarn.Spindle", "Spin"},
+       {"open lyrabox", "Lyra"}},
+      {{"open com.tarn.Snapvale; open com.tarn.Lumbra; open com.tarn.Officra.Slidewell", "none"}},
+      // What was in front keeps the remote while it runs and nothing else plays.
+      {{"open lyrabox; open com.tarn.Spindle; front com.tarn.Spindle", "Spin"},
+       {"front nobody", "Spin"},
+       {"tell lyrabox to play", "Lyra"},
+       {"tell lyrabox to stop", "Lyra"},
+       {"close lyrabox", "Spin"}},
+      // Priority alone is not remembered.
+      {{"open com.tarn.Spindle", "Spin"}, {"open lyrabox", "Lyra"}, {"close lyrabox", "Spin"}},
+      // A photo application in front is a target, and forgotten when it leaves.
+      {{"open com.tarn.vistremeplayer; front com.tarn.vistremeplayer", "Vist"},
+       {"open com.tarn.Snapvale; front com.tarn.Snapvale; open lyrabox", "Snap"},
+       {"front nobody", "Lyra"}},
+      // Paused is not playing.
+      {{"open lyrabox; open com.tarn.Spindle; front com.tarn.Spindle; tell lyrabox to play; tell lyrabox to "
+        "pause",
+        "Spin"},
+       {"front nobody", "Spin"}},
+  };
+  for (const std::vector<Step>& steps : rows) {
+    std::string expected;
+    for (const Step& step : steps) expected += std::string(step.target) + " ";
+    EXPECT_EQ(targetsAfter(steps), expected) << steps.back().before;
+  }
+}
+
+TEST(Target, IsAskedOncePerEvent) {
+  EXPECT_EQ(inChild([] {
+              set("open lyrabox");
+              refreshCachedASNs();
+              std::string targets = text(targetApplication());
+              set("open com.tarn.Spindle; front com.tarn.Spindle; close lyrabox");
+              targets += text(targetApplication());
+              DispatchHIDEvent(eventOf(Key::Menu), 1, false);
+              targets += text(targetApplication());
+              set("close com.tarn.Spindle");
+              DispatchHIDEvent(eventOf(Key::Menu), 1, false);
+              targets += text(targetApplication());
+              journal();
+              targetApplication();
+              return targets + " " + journal();
+            }),
+            "LyraLyraSpinnone ")
+      << "a target of none is remembered too";
+}
+
+/// What a dispatch sends to applications, and "+" when it was handled.
+std::string dispatched(const std::string& before, PackedHIDEvent event, std::int32_t value, bool locked) {
+  return inChild([&] {
+    set(before);
+    sent();
+    const bool handled = DispatchHIDEvent(event, value, locked);
+    return sent() + (handled ? "+" : "");
+  });
+}
+
+TEST(Dispatcher, LaunchesTheJukeboxWhenNobodyIsThere) {
+  const std::set<UsageKey> launching = {Key::SystemMenuSelect, Key::Play, Key::Pause, Key::PlayPause};
+  for (const remote::Button& button : remote::buttons()) {
+    const UsageKey key = UsageKeyOf(button.usagePage, button.usage);
+    for (const std::int32_t value : {1, 0}) {
+      EXPECT_EQ(dispatched("", eventOf(key), value, false), launching.contains(key) ? "launch; " : "")
+          << button.name;
+      EXPECT_EQ(dispatched("", eventOf(key), value, true), "") << button.name;
+    }
+  }
+}
+
+TEST(Dispatcher, RoutesByTheLow48Bits) {
+  const std::string toggle = "playpause; +";
+  const std::string front = "open lyrabox; front lyrabox";
+  const PackedHIDEvent event = eventOf(Key::PlayPause);
+  EXPECT_EQ(dispatched(front, event, 1, false), toggle);
+  EXPECT_EQ(dispatched(front, event, 1, true), toggle) << "a locked screen does not stop routing";
+  EXPECT_EQ(dispatched(front, event | 0xFFFF'0000'0000, 1, false), toggle) << "the extra field";
+  EXPECT_EQ(dispatched(front, event | 0xFFFF'0000'0000'0000, 1, false), toggle) << "bits above the event";
+  EXPECT_EQ(dispatched("open com.tarn.Snapvale; front com.tarn.Snapvale", event, 1, false), "");
+}
+
+TEST(Dispatcher, FollowsTheApplicationListAndKeepsTheTargetOfARepeat) {
+  EXPECT_EQ(
+      inChild([] {
+        set("open lyrabox; front lyrabox");
+        DispatchHIDEvent(eventOf(Key::Menu), 1, true);
+        const std::string refreshed = journal();
+        DispatchHIDEvent(eventOf(Key::Menu), 1, false);
+        const std::string unchanged = journal();
+        set("open com.tarn.Spindle; front com.tarn.Spindle");
+        journal();
+        const bool kept = doDispatch(eventOf(Key::Stop), 1, false);
+        return refreshed + "--\n" + unchanged + "--\n" + journal() + (kept ? "kept" : "lost") +
+               (sScreenLocked ? " locked" : "");
+      }),
+      "Lyrabox starts\nLyrabox comes to the front\nfinds Lyrabox running\nasks who is in front: Lyrabox\n--\n"
+      "asks who is in front: Lyrabox\n--\n"
+      "finds Lyrabox running\nfinds Spindle running\n"
+      "script: tell application id \"com.tarn.Lyrabox\" to stop\nkept");
+}
+
+TEST(Lyrabox, ObeysItsButtons) {
+  // What each button sends on press and release; all others send nothing and are not handled.
+  const std::map<UsageKey, std::pair<const char*, const char*>> expected = {
+      {Key::SystemMenuSelect, {"playpause", "playpause"}},
+      {Key::SystemMenuRight, {"next track", "next track"}},
+      {Key::SystemMenuLeft, {"back track", "back track"}},
+      {Key::MenuPick, {"event 'hook'/'RSel' to Lyrabox", "event 'hook'/'RSel' to Lyrabox"}},
+      {Key::MenuLeft, {"back track", "back track"}},
+      {Key::MenuRight, {"next track", "next track"}},
+      {Key::Play, {"playpause", "playpause"}},
+      {Key::Pause,
+       {"if player state is playing then ⏎ pause ⏎ end if ⏎ end",
+        "if player state is playing then ⏎ pause ⏎ end if ⏎ end"}},
+      {Key::FastForward, {"fast forward", "resume"}},
+      {Key::Rewind, {"rewind", "resume"}},
+      {Key::ScanNextTrack, {"next track", "next track"}},
+      {Key::ScanPreviousTrack, {"back track", "back track"}},
+      {Key::Stop, {"stop", "stop"}},
+      {Key::PlayPause, {"playpause", "playpause"}},
+  };
+  std::vector<UsageKey> keys = {Key::Undefined, 0x000C00B2, 0x00010087, 0x00010088, 0xFFFFFFFF};
+  for (const remote::Button& button : remote::buttons())
+    keys.push_back(UsageKeyOf(button.usagePage, button.usage));
+  EXPECT_EQ(keys.size(), 5U + 22U);
+  for (const UsageKey key : keys) {
+    for (const std::int32_t value : {1, -1, 0}) {
+      const auto row = expected.find(key);
+      std::string wanted;
+      if (row != expected.end())
+        wanted = std::string(value != 0 ? row->second.first : row->second.second) + "; +";
+      EXPECT_EQ(dispatched("open lyrabox; front lyrabox", eventOf(key), value, false), wanted)
+          << std::hex << key << " value " << value;
+    }
+  }
+}
+
+TEST(Lyrabox, OffersCommandsAndQueriesToOthers) {
+  EXPECT_EQ(inChild([] {
+              set("open lyrabox; tell lyrabox to play");
+              const auto state = [] {
+                return text(LyraboxPlayerState()) + (LyraboxIsPlaying() ? " plays; " : " silent; ");
+              };
+              std::string states = state();
+              LyraboxCommand_Pause();
+              states += state();
+              set("close lyrabox");
+              states += state();
+              sent();
+              set("open lyrabox");
+              journal();
+              LyraboxCommand_VolumeUp();
+              LyraboxCommand_VolumeDown();
+              return states + journal();
+            }),
+            "kPSP plays; kPSU silent; .... silent; "
+            "script: tell application id \"com.tarn.Lyrabox\" ⏎ set sound volume to sound volume + 2 ⏎ end\n"
+            "Lyrabox: volume 60 → 62\n= 62\n"
+            "script: tell application \"com.tarn.Lyrabox\" ⏎ set sound volume to sound volume - 2 ⏎ end\n"
+            "Lyrabox: volume 62 → 60\n= 60\n");
+}
+
+}  // namespace
