@@ -42,7 +42,8 @@ struct Constant {
   friend bool operator==(const Constant&, const Constant&) = default;
 };
 
-/// One object of an application: its class and a number that only the application understands.
+/// One object of an application: its class and a number that only the application understands. The
+/// application itself is of kApplicationClass and has the number 0.
 struct ObjectRef {
   Application* application = nullptr;
   Code cls = 0;
@@ -79,7 +80,8 @@ struct ClassTerm {
   Code code;
 };
 
-/// A property of the objects of one class.
+/// A property of the objects of one class. A value set is made its type first: integers become reals, reals
+/// lose their fraction, numbers become texts; what else does not fit is an error of the script.
 struct PropertyTerm {
   Code owner;
   std::string_view words;
@@ -108,8 +110,8 @@ struct ConstantTerm {
   Code code;
 };
 
-/// An application's words as tables, matched longest first and without regard to case. The tables must
-/// outlive it.
+/// An application's words as tables, matched longest first and without regard to case. Words are one blank
+/// apart and never "the", which scripts may write anywhere. The tables must outlive it.
 struct Dictionary {
   std::span<const ClassTerm> classes;
   std::span<const PropertyTerm> properties;
@@ -124,7 +126,7 @@ struct Dictionary {
 /// A command on its way to an application.
 struct Event {
   Code command = 0;
-  /// What the innermost tell block is about.
+  /// What the innermost tell block is about; for the commands of the additions, the additions themselves.
   ObjectRef target;
   /// The direct parameter, where one was written.
   std::optional<Value> direct;

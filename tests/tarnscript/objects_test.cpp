@@ -1,0 +1,195 @@
+// Scripts against applications: words, objects, commands, and applications that do not answer.
+#include <gtest/gtest.h>
+
+#include "tests/tarnscript/fakes.h"
+
+namespace tarnscript {
+namespace {
+
+std::string tell(const std::string& body) {
+  return "tell application id \"com.tarn.Player\"\n" + body + "\nend tell";
+}
+
+struct Case {
+  const char* body;
+  const char* expected;
+};
+
+/// Each body in a tell of the player.
+void expectAll(std::initializer_list<Case> cases) {
+  for (const auto& [body, expected] : cases) EXPECT_EQ(runScript(tell(body)), expected) << body;
+}
+
+TEST(Objects, AreAddressedInManyWays) {
+  expectAll({
+      {"front document", "docu#1"},
+      {"the last document", "docu#2"},
+      {"DOCUMENT 2", "docu#2"},
+      {"set n to 1\nalbum (n + 1)", "albm#2"},
+      {"set n to 3\nalbum n", "albm#3"},
+      {"album -1", "albm#6"},
+      {"album 7", "error 2: there is no such album"},
+      {"document", "error 2: expected the number of an element, found the end of the line"},
+      {"last slide of first slideshow", "slid#71"},
+      {"every document", "{docu#1, docu#2}"},
+      {"count albums", "6"},
+      {"count of every album", "6"},
+      {"the name of every document", "{\"Clip 1\", \"Clip 2\"}"},
+      {"name of current album", "\"Album 3\""},
+      {"current album's name", "\"Album 3\""},
+      {"tell front document to its name", "\"Clip 1\""},
+      {"it", "capp#0"},
+      {"the current album is album 3", "true"},
+      {"item 3 of {album 1, album 2, \"x\"} is the current album", "false"},
+      {"set d to last document\nset rate of d to 3\nrate of d", "3.0 | rate of docu#2 = 3.0"},
+      {"set rate of every document to 2", "2 | rate of docu#1 = 2.0; rate of docu#2 = 2.0"},
+      {"rate of 5", "error 2: an integer has no property 'rate' here"},
+      {"rate", "error 2: an object has no property 'rate' here"},
+      {"document 1 of album 1", "error 2: there is no such document"},
+      {"tell {1} to play", "error 2: cannot tell a list anything"},
+  });
+}
+
+TEST(Objects, WordsAreTakenByPositionAndLength) {
+  expectAll({
+      {"player state is playing", "true"},
+      {"player state is not playing", "false"},
+      {"player state = paused", "false"},
+      {"set d to front document\nset rate of d to 0\nd is playing", "true | rate of docu#1 = 0.0"},
+      {"set player state to playing", "'kPSP' | stat of capp#0 = 'kPSP'"},
+      {"set player state to 5", "error 2: cannot make an integer into a constant"},
+      {"set sound volume to sound volume - 2", "48 | vol  of capp#0 = 48"},
+      {"set sound volume to -2.9", "-2.9 | vol  of capp#0 = -2"},
+      {"set name of document 1 to 5", "5 | pnam of docu#1 = \"5\""},
+      {"set current album to 5", "error 2: cannot make an integer into an object"},
+      {"set sound volume to true", "error 2: cannot make a boolean into an integer"},
+      {"if frozen then\nset frozen to false\nelse\nset frozen to true\nend if",
+       "true | froz of capp#0 = true"},
+      {"tell front document to set frozen to true", "true | froz of capp#0 = true"},
+      {"chapter - 1", "0"},
+      {"slideshow running", "true"},
+      {"get get rate of front document", "1.0"},
+      {"show last slide of first slideshow", "none | show in capp#0: slid#71"},
+      {"show next slide", "none | next in capp#0"},
+      {"tell front document to show remote hud", "none | hud  in docu#1"},
+      {"go to main menu", "none | menu in capp#0"},
+      {"fast forward now", "error 2: expected the end of the line, found 'now'"},
+      {"select album (count of {1, 2})", "none | slct in capp#0: albm#2"},
+      {"play", "none | play in capp#0"},
+      {"play frontMovie", "error 2: the variable 'frontMovie' is not set"},
+      {"tell application \"Keyhouse\" to key code 53 using command down",
+       "none | keyc in capp#0: 53 usng='cmdd'"},
+      {"tell application \"Keyhouse\" to key code 48 using {command down, shift down}",
+       "none | keyc in capp#0: 48 usng={'cmdd', 'shfd'}"},
+      {"tell application \"Keyhouse\" to key code 48 using 5",
+       "error 2: cannot make an integer into a constant"},
+      {"tell application \"Keyhouse\"\ntell process id \"abc\"\nkey code 53\nend\nend",
+       "none | keyc in prcs#3: 53"},
+      {"tell application \"Keyhouse\" to fast forward",
+       "error 2: expected the end of the line, found 'forward'"},
+      {"output muted of (get get volume settings)", "true | gvol in capp#0"},
+      {"set volume 30 without output muted", "none | svol in capp#0: 30 mute=false"},
+      {"set volume output volume 30.0 with output muted", "none | svol in capp#0 mute=true ouvl=30"},
+      {"set volume with output volume",
+       "error 2: expected a parameter that is true or false, found 'output'"},
+  });
+  EXPECT_EQ(runScript("output volume of (get volume settings)"), "40 | gvol in capp#0");
+  EXPECT_EQ(runScript("(get volume settings) is (get volume settings)"),
+            "true | gvol in capp#0; gvol in capp#0");
+  EXPECT_EQ(runScript("name of (get volume settings)"), "error 1: expected the end of the line, found 'of'");
+}
+
+TEST(Objects, StateMachinesOfRealScripts) {
+  const std::string chapterBack = tell(
+      "if chapter > 1 then \n set chapter to chapter - 1 \n else if elapsed time > 5 then \n"
+      " set chapter to 1 \n else \n go to main menu \n end if");
+  const auto chapterFrom = [&](std::int64_t chapter, std::int64_t time) {
+    FakeWorld world;
+    world.player.state[{words::kApp, 0, code("chap")}] = chapter;
+    world.player.state[{words::kApp, 0, code("time")}] = time;
+    runScript(world, chapterBack);
+    return world.log.front();
+  };
+  EXPECT_EQ(chapterFrom(2, 0), "chap of capp#0 = 1");
+  EXPECT_EQ(chapterFrom(1, 6), "chap of capp#0 = 1");
+  EXPECT_EQ(chapterFrom(1, 5), "menu in capp#0");
+
+  const std::string ladder = tell(
+      "set maxRate to 8.0 \n set scanRate to rate of front document \n"
+      " tell front document to show remote hud \n if scanRate is greater than 1.0 then \n"
+      " if scanRate is maxRate then \n set rate of front document to 2.0 \n else \n"
+      " set rate of front document to scanRate * 2 \n end if \n else if scanRate is less than 0.0 then \n"
+      " if scanRate is -2.0 then \n set rate of front document to 1.0 \n else \n"
+      " set rate of front document to scanRate / 2 \n end if \n else \n step forward front document \n end "
+      "if");
+  const std::initializer_list<std::pair<double, const char*>> steps = {
+      {2, "rate of docu#1 = 4.0"},   {8, "rate of docu#1 = 2.0"},   {3, "rate of docu#1 = 6.0"},
+      {-2, "rate of docu#1 = 1.0"},  {-8, "rate of docu#1 = -4.0"}, {1, "stpf in capp#0: docu#1"},
+      {0, "stpf in capp#0: docu#1"},
+  };
+  for (const auto& [rate, expected] : steps) {
+    FakeWorld world;
+    world.player.state[{words::kDoc, 1, code("rate")}] = rate;
+    runScript(world, ladder);
+    EXPECT_EQ(world.log, (std::vector<std::string>{"hud  in docu#1", expected})) << rate;
+  }
+}
+
+TEST(Objects, NextAlbumInDisplayOrder) {
+  const std::string source =
+      "tell application id\"com.tarn.Player\"\n\tset theAlbums to the id of every album\n"
+      "set albumIndex to -1\nrepeat with i from 1 to count theAlbums\n"
+      "if the id of current album is item i of theAlbums then\nset albumIndex to i\nend if\nend repeat\n"
+      "if the current album is album 1 then\ntell application id \"com.tarn.Player\" to activate\n"
+      "select album 4\nelse if current album is album 4\n"
+      "tell application id \"com.tarn.Player\" to activate\nselect album 2\n"
+      "else if the current album is album 2\ntell application id \"com.tarn.Player\" to activate\n"
+      "select album 3\nelse if the current album is album 3\nselect album 5\n"
+      "else if albumIndex >= the (count of theAlbums) then\nselect album (count theAlbums)\n"
+      "else if albumIndex > 0 then\nselect album (albumIndex + 1)\nend if\nend tell";
+  const std::initializer_list<std::pair<std::uint64_t, const char*>> steps = {
+      {1, "none | activate; slct in capp#0: albm#4"}, {2, "none | activate; slct in capp#0: albm#3"},
+      {3, "none | slct in capp#0: albm#5"},           {4, "none | activate; slct in capp#0: albm#2"},
+      {5, "none | slct in capp#0: albm#6"},           {6, "none | slct in capp#0: albm#6"},
+  };
+  for (const auto& [current, expected] : steps) {
+    FakeWorld world;
+    world.player.state[{words::kApp, 0, code("cura")}] = ObjectRef{&world.player, words::kAlbum, current};
+    EXPECT_EQ(runScript(world, source), expected);
+  }
+}
+
+TEST(Objects, ApplicationsThatDoNotRun) {
+  const auto whenQuit = [](const std::string& body) {
+    FakeWorld world;
+    world.player.runs = false;
+    return runScript(world, tell(body));
+  };
+  EXPECT_EQ(whenQuit("play"), "error 2: the application is not running");
+  EXPECT_EQ(whenQuit("frozen"), "error 2: the application is not running");
+  EXPECT_EQ(whenQuit("count documents"), "error 2: the application is not running");
+  EXPECT_EQ(whenQuit("launch\nplay"), "none | launch; play in capp#0");
+  EXPECT_EQ(whenQuit("activate\nfrozen"), "false | activate");
+  EXPECT_EQ(whenQuit("tell application \"Keyhouse\" to activate application \"com.tarn.player\""),
+            "none | activate");
+  EXPECT_EQ(whenQuit("ignoring application responses\nfrozen\nplay\nend ignoring\n5"), "5");
+}
+
+TEST(Objects, RefusalsEndTheScriptUnlessIgnored) {
+  const auto whenRefused = [](const std::string& body) {
+    FakeWorld world;
+    world.player.refused.insert(code("paus"));
+    world.player.hangs = true;
+    return runScript(world, tell(body));
+  };
+  EXPECT_EQ(whenRefused("play\npause\nplay"), "error 3: refused | stall; play in capp#0; stall");
+  EXPECT_EQ(whenRefused("ignoring application responses\nplay\npause\nplay document 9\nset x to play\n"
+                        "if rate of document 9 is 1 then play\nplay front document\nend ignoring"),
+            "none | play in capp#0; play in capp#0; play in capp#0: docu#1");
+  EXPECT_EQ(whenRefused("ignoring application responses\n1 div 0\nend"), "error 3: division by zero");
+  EXPECT_EQ(whenRefused("ignoring application responses\nend\nplay"), "none | stall; play in capp#0");
+  EXPECT_EQ(whenRefused("set x to play"), "error 2: there is no value here | stall; play in capp#0");
+}
+
+}  // namespace
+}  // namespace tarnscript
