@@ -24,8 +24,8 @@ void setSendSocket(mach_port_t name, FileDescriptor socket);
 int sendSocket(mach_port_t name);
 
 /// Reads what waits in the kernel's queue into memory where this process is the port's receiver, so that it
-/// cannot wait for itself; true when there was something. Set by the receiving side; null in a program that only
-/// sends.
+/// cannot wait for itself; true when there was something. Set by the receiving side; null in a program that
+/// only sends.
 using MakeRoom = bool (*)(mach_port_t name);
 extern MakeRoom makeRoom;
 

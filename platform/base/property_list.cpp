@@ -74,8 +74,8 @@ Owned<HostObject> PropertyListReader::readList(const Tag& tag, int depth) {
     values.push_back(readValue(xml_.openTag(), depth + 1));
   }
   if (!tag.closed) xml_.closeTag(tag.name);
-  std::vector<HostObject*> items;
-  for (auto& value : values) items.push_back(value.release());
+  std::vector<HostObject*> items(values.size());
+  std::ranges::transform(values, items.begin(), [](auto& value) { return value.release(); });
   return Owned<HostObject>(new List(std::move(items)));
 }
 

@@ -115,7 +115,8 @@ void XmlReader::skipComment() {
 /// The rest of a document type without declarations of its own: those could make entities that grow.
 void XmlReader::skipDocumentType() {
   const std::string_view type = takeUntil(">");
-  if (type.find('[') != std::string_view::npos) fail("declarations in the document type are not read");
+  if (type.find_first_of("[<") != std::string_view::npos)
+    fail("declarations in the document type are not read");
 }
 
 bool XmlReader::skip(std::string_view expected) {
