@@ -34,6 +34,9 @@ TEST(Limits, Nesting) {
         "x" + times(1000, "'s item 1"), "{" + times(1000, "(1) & {") + times(1000, "}") + "}"}) {
     EXPECT_NE(runScript(source).find("nested too deeply"), std::string::npos) << source.substr(0, 60);
   }
+  // Neither the lists nor the chains are too deep by themselves.
+  EXPECT_EQ(runScript(times(20, "{") + "1" + times(20, times(20, "&1") + "}")),
+            "error 1: the expression is nested too deeply");
   EXPECT_EQ(runScript("if false then\n" + times(2000, "else if false then\n") + "else\n7\nend if"), "7");
   EXPECT_EQ(runScript(times(2000, "get ") + "7"), "7");
 }

@@ -56,6 +56,7 @@ TEST(Objects, WordsAreTakenByPositionAndLength) {
       {"player state is not playing", "false"},
       {"player state = paused", "false"},
       {"set d to front document\nset rate of d to 0\nd is playing", "true | rate of docu#1 = 0.0"},
+      {"tell front document to it is name", "false"},
       {"set player state to playing", "'kPSP' | stat of capp#0 = 'kPSP'"},
       {"set player state to 5", "error 2: cannot make an integer into a constant"},
       {"set sound volume to sound volume - 2", "48 | vol  of capp#0 = 48"},
