@@ -179,7 +179,9 @@ StatementRef Parser::parseIf() {
     const ExpressionRef condition = parseExpression();
     const bool hasThen = accept(Keyword::Then);
     if (first == kNone && hasThen && token().kind != TokenKind::EndOfLine) {
-      return addStatement(line, If{condition, parseStatement(), kNone, kNone});
+      const StatementRef body = parseStatement();
+      const StatementRef otherwise = accept(Keyword::Else) ? parseStatement() : kNone;
+      return addStatement(line, If{condition, body, kNone, otherwise});
     }
     expect(TokenKind::EndOfLine, hasThen ? "the end of the line" : "'then'");
     const StatementRef branch = addStatement(line, If{condition, parseBody(), kNone, kNone});

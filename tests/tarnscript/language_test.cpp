@@ -90,6 +90,8 @@ TEST(Language, BlocksAndTheirResults) {
       {"repeat 3 times\nreturn 7\nend repeat\n8", "7"},
       {"repeat while 1\nend", "error 1: expected true or false, not an integer"},
       {"if false then 1", "none"},
+      {"if false then 1 else if true then 2 else 3", "2"},
+      {"if true then if false then 1 else 2", "2"},
       {"if false then\n1\nelse if true\n2\nelse\n3\nend if", "2"},
       {"if false\n1\nelse if false then\n2\nelse\n3\nend", "3"},
       {"if true then\n-- a comment\n1 # another\nend if -- and a third", "1"},
