@@ -9,6 +9,8 @@
 #include <ctime>
 #include <utility>
 
+#include "platform/base/sockets.h"
+
 namespace base {
 namespace {
 
@@ -31,12 +33,12 @@ void sleepOnBootTime(Nanoseconds duration) {
 }
 
 /// A timer descriptor that becomes readable at the deadline. A time-out of poll would not count the time that
-/// the machine sleeps.
-int armedTimer(Nanoseconds deadline) {
-  static const int timer = timerfd_create(CLOCK_BOOTTIME, TFD_CLOEXEC | TFD_NONBLOCK);
+/// the machine sleeps. Made for one wait: a timer that is kept would be shared with forked children.
+FileDescriptor armedTimer(Nanoseconds deadline) {
+  FileDescriptor timer(timerfd_create(CLOCK_BOOTTIME, TFD_CLOEXEC | TFD_NONBLOCK));
   // A time of zero would disarm it.
   const itimerspec at{.it_interval = {}, .it_value = toTimespec(std::max<Nanoseconds>(deadline, 1))};
-  timerfd_settime(timer, TFD_TIMER_ABSTIME, &at, nullptr);
+  timerfd_settime(timer.get(), TFD_TIMER_ABSTIME, &at, nullptr);
   return timer;
 }
 
@@ -48,9 +50,10 @@ TimeSource& current() {
 }  // namespace
 
 void waitForSources(std::optional<Nanoseconds> deadline) {
+  const FileDescriptor timer = deadline ? armedTimer(*deadline) : FileDescriptor();
   std::array<pollfd, 2> watched{};
   watched[0] = {.fd = runLoopDescriptor(), .events = POLLIN, .revents = 0};
-  watched[1] = {.fd = deadline ? armedTimer(*deadline) : -1, .events = POLLIN, .revents = 0};
+  watched[1] = {.fd = timer.get(), .events = POLLIN, .revents = 0};
   // An interruption only makes the loop look again.
   poll(watched.data(), watched.size(), -1);
 }

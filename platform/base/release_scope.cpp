@@ -1,6 +1,5 @@
 // Temporary objects belong to the innermost scope that is open when they are made.
 #include <algorithm>
-#include <utility>
 #include <vector>
 
 #include "platform/base/object.h"
@@ -16,11 +15,7 @@ struct ReleaseScope final : HostObject {
   ReleaseScope() : HostObject(kKind) { open.push_back(this); }
   ~ReleaseScope() override {
     std::erase(open, this);
-    releaseTemporaries();
-  }
-
-  void releaseTemporaries() {
-    for (HostObject* object : std::exchange(temporaries, {})) HostRelease(object);
+    for (HostObject* object : temporaries) HostRelease(object);
   }
 
   std::vector<HostObject*> temporaries;
@@ -46,7 +41,6 @@ void HostCloseReleaseScope(HostReleaseScopeRef scope) {
     base::ReleaseScope* innermost = base::open.back();
     closed = innermost == scope.object;
     base::open.pop_back();
-    innermost->releaseTemporaries();
     HostRelease(innermost);
   }
 }

@@ -34,7 +34,6 @@ bool fireDueTimers(const RunLoop& loop) {
 /// True when there was something to do.
 bool runPass(const RunLoop& loop) {
   const bool fired = fireDueTimers(loop);
-  if (loop.stopped) return fired;
   const auto source = retained(nextReadySource());
   if (source == nullptr || loop.stopped) return fired;
   source->ready();

@@ -1,6 +1,8 @@
 #include "platform/base/sources.h"
 
+#include <pthread.h>
 #include <sys/epoll.h>
+#include <unistd.h>
 
 #include <algorithm>
 #include <utility>
@@ -11,10 +13,22 @@ namespace {
 
 /// One reference to each is the loop's.
 std::vector<Source*> sources;
+int epollDescriptor = -1;
+
+bool watch(Source& source) {
+  epoll_event interest{.events = EPOLLIN, .data = {.ptr = &source}};
+  return epoll_ctl(runLoopDescriptor(), EPOLL_CTL_ADD, source.fd, &interest) == 0;
+}
+
+/// A forked child inherits its parent's set itself, no copy: what it adds and removes would be the parent's.
+void renewInChild() {
+  close(epollDescriptor);
+  epollDescriptor = epoll_create1(EPOLL_CLOEXEC);
+  for (Source* source : sources) watch(*source);
+}
 
 void add(Source& source) {
-  epoll_event interest{.events = EPOLLIN, .data = {.ptr = &source}};
-  if (source.onLoop || epoll_ctl(runLoopDescriptor(), EPOLL_CTL_ADD, source.fd, &interest) != 0) return;
+  if (source.onLoop || !watch(source)) return;
   HostRetain(&source);
   sources.push_back(&source);
   source.onLoop = true;
@@ -46,8 +60,11 @@ std::vector<Source*> readySources() {
 }  // namespace
 
 int runLoopDescriptor() {
-  static const int descriptor = epoll_create1(EPOLL_CLOEXEC);
-  return descriptor;
+  if (epollDescriptor < 0) {
+    epollDescriptor = epoll_create1(EPOLL_CLOEXEC);
+    pthread_atfork(nullptr, nullptr, renewInChild);
+  }
+  return epollDescriptor;
 }
 
 Source::Source(int descriptor, std::int32_t rank, std::function<void()> callback)
