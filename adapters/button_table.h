@@ -16,6 +16,9 @@ struct ButtonRow {
   bool result;  ///< what the adapter's entry answers
 };
 
+/// Takes a button and does nothing.
+inline void Swallow(std::int32_t) {}
+
 /// Runs a command whatever the value.
 template <void (*Command)()>
 void Run(std::int32_t) {

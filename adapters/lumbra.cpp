@@ -1,3 +1,93 @@
 #include "adapters/lumbra.h"
 
-bool LumbraHandleHIDEvent(std::uint32_t, std::uint32_t, std::int32_t) { return false; }
+#include "daemon/kvd.h"
+#include "routing/display.h"
+#include "routing/keys.h"
+#include "routing/silence.h"
+
+namespace {
+
+// Virtual key codes.
+constexpr std::uint16_t kS = 1;
+constexpr std::uint16_t kReturn = 36;
+constexpr std::uint16_t kSpace = 49;
+constexpr std::uint16_t kEscape = 53;
+constexpr std::uint16_t kLeftArrow = 123;
+constexpr std::uint16_t kRightArrow = 124;
+constexpr std::uint16_t kDownArrow = 125;
+constexpr std::uint16_t kUpArrow = 126;
+
+constexpr std::uint32_t kBeforeReturn = 10'000;  // microseconds
+
+void Post(std::uint16_t keyCode, bool withShift = false) {
+  PostKeyEvent(HostGetConstantString(Bundle::Lumbra), keyCode, withShift);
+}
+
+bool Nothing(std::int32_t) { return true; }
+
+bool StartOrPause(std::int32_t) {
+  if (AnyDisplayIsCaptured()) {
+    Post(kSpace);
+    return true;
+  }
+  SilenceAllBut(App::Lumb);
+  Post(kS, true);
+  HostSleepMicroseconds(kBeforeReturn);
+  Post(kReturn);
+  return true;
+}
+
+bool Exit(std::int32_t) {
+  LumbraCommand_ExitSlideShow();
+  return true;
+}
+
+/// Steps through the photos; the release is taken too.
+template <std::uint16_t Arrow>
+bool Step(std::int32_t value) {
+  if (value != 0) Post(Arrow);
+  return true;
+}
+
+/// Moves outside a slideshow; a release is not the application's.
+template <std::uint16_t Arrow>
+bool Move(std::int32_t value) {
+  if (AnyDisplayIsCaptured() || value == 0) return false;
+  Post(Arrow);
+  return true;
+}
+
+struct Row {
+  UsageKey key;
+  bool (*rule)(std::int32_t value);
+};
+
+constexpr Row kButtons[] = {
+    {Key::Undefined, Nothing},
+    {Key::SystemAppMenu, Nothing},
+    {Key::SystemMenuSelect, StartOrPause},
+    {Key::SystemMenuRight, Step<kRightArrow>},
+    {Key::SystemMenuLeft, Step<kLeftArrow>},
+    {Key::SystemMenuUp, Move<kUpArrow>},
+    {Key::SystemMenuDown, Move<kDownArrow>},
+    {Key::Menu, Exit},
+    {Key::MenuPick, Nothing},
+    {Key::FastForward, Step<kRightArrow>},
+    {Key::Rewind, Step<kLeftArrow>},
+    {Key::Stop, Exit},
+    {Key::PlayPause, StartOrPause},
+};
+
+}  // namespace
+
+bool LumbraHandleHIDEvent(std::uint32_t usagePage, std::uint32_t usage, std::int32_t value) {
+  const UsageKey key = UsageKeyOf(usagePage, usage);
+  for (const Row& row : kButtons) {
+    if (row.key == key) return row.rule(value);
+  }
+  return false;
+}
+
+void LumbraCommand_ExitSlideShow() {
+  if (AnyDisplayIsCaptured()) Post(kEscape);
+}

@@ -9,6 +9,8 @@ set(core_sources
   daemon/lifecycle.cpp
   daemon/messages.cpp
   routing/dispatcher.cpp
+  routing/display.cpp
+  routing/keys.cpp
   routing/retrigger.cpp
   routing/silence.cpp
   routing/target.cpp

@@ -25,6 +25,11 @@ constexpr PackedHIDEvent PackHIDEvent(HIDEvent event) {
   return PackedHIDEvent{event.extra} << 32 | PackedHIDEvent{event.usage} << 16 | event.usagePage;
 }
 
+constexpr HIDEvent UnpackHIDEvent(PackedHIDEvent event) {
+  return {static_cast<std::uint16_t>(event), static_cast<std::uint16_t>(event >> 16),
+          static_cast<std::uint16_t>(event >> 32)};
+}
+
 /// The usage page of a packed event, as adapters take it.
 constexpr std::uint32_t UsagePageOf(PackedHIDEvent event) { return event & 0xFFFF; }
 /// The usage of a packed event, as adapters take it.
