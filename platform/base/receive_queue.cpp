@@ -24,7 +24,7 @@ bool isTrusted(msghdr& datagram) {
   if (control->cmsg_level != SOL_SOCKET || control->cmsg_type != SCM_CREDENTIALS) return false;
   ucred sender{};
   std::memcpy(&sender, CMSG_DATA(control), sizeof sender);
-  return sender.uid == geteuid() || sender.uid == 0;
+  return sender.uid == geteuid();
 }
 
 std::optional<Datagram> receive(int socket) {
