@@ -9,7 +9,7 @@ tap play
   timer of 10m starts
   notification com.tarn.kvd.started of com.tarn.kvd
   asks who is in front: nobody ×7
-  script: tell application id "com.tarn.Lyrabox" to launch
+  script to Lyrabox: launch
   Lyrabox starts
 
 # The jukebox runs now, so the next Play reaches it, and one more pauses it: Play toggles.
@@ -17,43 +17,43 @@ tap play
   finds Lyrabox running
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSS'
+  script to Lyrabox: get player state = 'kPSS'
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to playpause
+  script to Lyrabox: playpause
   Lyrabox: plays "Harbour Lights"
 wait 1m30s
 tap play
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSP'
-  script: tell application id "com.tarn.Lyrabox" to playpause
+  script to Lyrabox: get player state = 'kPSP'
+  script to Lyrabox: playpause
   Lyrabox: paused in "Harbour Lights" at 1:30
 
 # Next track; then a scan for as long as the button is held.
 tap play
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSU'
+  script to Lyrabox: get player state = 'kPSU'
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to playpause
+  script to Lyrabox: playpause
   Lyrabox: plays "Harbour Lights"
 tap next
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSP'
-  script: tell application id "com.tarn.Lyrabox" to next track
+  script to Lyrabox: get player state = 'kPSP'
+  script to Lyrabox: next track
   Lyrabox: plays "Paper Boats"
 hold forward 3s
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSP'
-  script: tell application id "com.tarn.Lyrabox" to fast forward
+  script to Lyrabox: get player state = 'kPSP'
+  script to Lyrabox: fast forward
   Lyrabox: scans forward through "Paper Boats"
   +3s  asks who is in front: nobody
   +3s  asks whether Lyrabox runs: yes
-  +3s  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSF'
+  +3s  script to Lyrabox: get player state = 'kPSF'
   +3s  asks whether Lyrabox runs: yes
-  +3s  script: tell application id "com.tarn.Lyrabox" to resume
+  +3s  script to Lyrabox: resume
   +3s  Lyrabox: plays "Paper Boats"
 
 # An editor comes to the front. The jukebox still plays, so the remote is still its.
@@ -65,25 +65,25 @@ tap pause
   finds Lyrabox running
   asks who is in front: Editor
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSP'
-  script: tell application id "com.tarn.Lyrabox" ⏎ if player state is playing then ⏎ pause ⏎ end if ⏎ end
+  script to Lyrabox: get player state = 'kPSP'
+  script to Lyrabox: if player state is playing then ⏎ pause ⏎ end if
   Lyrabox: paused in "Paper Boats" at 0:24
 
 # It plays no more, but it was the last one chosen.
 tap play
   asks who is in front: Editor
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSU'
+  script to Lyrabox: get player state = 'kPSU'
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to playpause
+  script to Lyrabox: playpause
   Lyrabox: plays "Paper Boats"
 
 # With the screen locked kvd launches nothing.
 tap stop
   asks who is in front: Editor
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSP'
-  script: tell application id "com.tarn.Lyrabox" to stop
+  script to Lyrabox: get player state = 'kPSP'
+  script to Lyrabox: stop
   Lyrabox: stopped
 close lyrabox
   Lyrabox quits

@@ -9,6 +9,10 @@ namespace stage {
 
 namespace {
 
+using tarnscript::Code;
+using tarnscript::ObjectRef;
+using tarnscript::Value;
+
 constexpr tarnscript::Dictionary kNoWords{};
 
 [[noreturn]] void refuse(const Application& application) {
@@ -35,27 +39,43 @@ void Application::activate() {
 
 void Application::deliver(bool waitsForReply) {
   if (waitsForReply && hangsUntil > now()) pass(hangsUntil - now());
+  if (manner == Manner::Refuses) throw tarnscript::Refusal{name + " refuses"};
   advance();
 }
 
-tarnscript::Value Application::get(const tarnscript::ObjectRef&, tarnscript::Code) { refuse(*this); }
-
-void Application::set(const tarnscript::ObjectRef&, tarnscript::Code, const tarnscript::Value&) {
-  refuse(*this);
+Value Application::get(const ObjectRef& object, Code property) {
+  return manner == Manner::Ignores ? Value{} : read(object, property);
 }
 
-std::vector<tarnscript::ObjectRef> Application::elements(const tarnscript::ObjectRef&, tarnscript::Code) {
-  refuse(*this);
+void Application::set(const ObjectRef& object, Code property, const Value& value) {
+  if (manner != Manner::Ignores) write(object, property, value);
 }
 
-tarnscript::ObjectRef Application::elementWithID(const tarnscript::ObjectRef&, tarnscript::Code,
-                                                 const tarnscript::Value&) {
-  refuse(*this);
+std::vector<ObjectRef> Application::elements(const ObjectRef& object, Code cls) {
+  return manner == Manner::Ignores ? std::vector<ObjectRef>{} : list(object, cls);
 }
 
-tarnscript::Value Application::perform(const tarnscript::Event&) { refuse(*this); }
+ObjectRef Application::elementWithID(const ObjectRef& object, Code cls, const Value& id) {
+  return manner == Manner::Ignores ? object : find(object, cls, id);
+}
+
+Value Application::perform(const tarnscript::Event& event) {
+  return manner == Manner::Ignores ? Value{} : obey(event);
+}
 
 void Application::receiveEvent(std::uint32_t, std::uint32_t) {}
+
+void Application::receiveKey(std::uint16_t, bool) {}
+
+Value Application::read(const ObjectRef&, Code) { refuse(*this); }
+
+void Application::write(const ObjectRef&, Code, const Value&) { refuse(*this); }
+
+std::vector<ObjectRef> Application::list(const ObjectRef&, Code) { refuse(*this); }
+
+ObjectRef Application::find(const ObjectRef&, Code, const Value&) { refuse(*this); }
+
+Value Application::obey(const tarnscript::Event&) { refuse(*this); }
 
 void Application::changed(const std::string& what) const { record(Entry::Change, name + ": " + what); }
 

@@ -1,5 +1,5 @@
-// A model application: what it is called, which of its instances run, and what scripts, events and time do to
-// it.
+// A model application: what it is called, which of its instances run, and what scripts, events, keys and time
+// do to it.
 #pragma once
 
 #include <optional>
@@ -12,6 +12,13 @@
 
 namespace stage {
 
+/// How an application treats scripts.
+enum class Manner {
+  Obeys,    ///< does as it is told
+  Refuses,  ///< answers everything with an error
+  Ignores,  ///< does nothing and answers nothing
+};
+
 /// An application of the rehearsal desktop; by itself one that can be started, brought to the front and quit,
 /// and understands no words of its own.
 class Application : public tarnscript::Application {
@@ -22,30 +29,34 @@ class Application : public tarnscript::Application {
 
   const std::string identifier;
   const std::string name;
-  const std::string version;
+  /// Empty when it has none.
+  std::string version;
 
   /// Its running instances, oldest first.
   std::vector<HostProcessSerialNumber> instances;
+  Manner manner = Manner::Obeys;
   /// Until then it answers nobody.
   Nanoseconds hangsUntil = 0;
 
   const tarnscript::Dictionary& dictionary() const override;
   bool running() const override { return !instances.empty(); }
-  void launch() override;
-  void activate() override;
+  void launch() final;
+  void activate() final;
   /// A hung application makes a script that waits for replies wait.
-  void deliver(bool waitsForReply) override;
-  tarnscript::Value get(const tarnscript::ObjectRef& object, tarnscript::Code property) override;
+  void deliver(bool waitsForReply) final;
+  tarnscript::Value get(const tarnscript::ObjectRef& object, tarnscript::Code property) final;
   void set(const tarnscript::ObjectRef& object, tarnscript::Code property,
-           const tarnscript::Value& value) override;
+           const tarnscript::Value& value) final;
   std::vector<tarnscript::ObjectRef> elements(const tarnscript::ObjectRef& object,
-                                              tarnscript::Code cls) override;
+                                              tarnscript::Code cls) final;
   tarnscript::ObjectRef elementWithID(const tarnscript::ObjectRef& object, tarnscript::Code cls,
-                                      const tarnscript::Value& id) override;
-  tarnscript::Value perform(const tarnscript::Event& event) override;
+                                      const tarnscript::Value& id) final;
+  tarnscript::Value perform(const tarnscript::Event& event) final;
 
   /// An inter-application event arrived.
   virtual void receiveEvent(std::uint32_t eventClass, std::uint32_t eventID);
+  /// A key was pressed in it, with Shift held or not.
+  virtual void receiveKey(std::uint16_t virtualKey, bool withShift);
   /// Its first instance started, its last one ended.
   virtual void started() {}
   virtual void ended() {}
@@ -57,6 +68,15 @@ class Application : public tarnscript::Application {
   virtual std::string describe() const { return {}; }
 
  protected:
+  // What a model answers to scripts. The defaults refuse.
+  virtual tarnscript::Value read(const tarnscript::ObjectRef& object, tarnscript::Code property);
+  virtual void write(const tarnscript::ObjectRef& object, tarnscript::Code property,
+                     const tarnscript::Value& value);
+  virtual std::vector<tarnscript::ObjectRef> list(const tarnscript::ObjectRef& object, tarnscript::Code cls);
+  virtual tarnscript::ObjectRef find(const tarnscript::ObjectRef& object, tarnscript::Code cls,
+                                     const tarnscript::Value& id);
+  virtual tarnscript::Value obey(const tarnscript::Event& event);
+
   /// Writes into the journal that something changed in it.
   void changed(const std::string& what) const;
 };

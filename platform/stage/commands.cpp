@@ -11,6 +11,7 @@
 #include "platform/stage/director.h"
 #include "platform/stage/report.h"
 #include "platform/stage/script_world.h"
+#include "platform/stage/spindle.h"
 #include "remote/buttons.h"
 #include "remote/kvd_client.h"
 #include "remote/kvd_messages.h"
@@ -159,7 +160,75 @@ void volume(const Words& words) {
 
 void mute(const Words& words) { setOutputMuted(onOrOff(words.at(0))); }
 
-void windowServer(const Words& words) { desktop().windowServerUp = onOrOff(words.at(0)); }
+struct Part {
+  std::string_view name;
+  bool Broken::*flag;
+};
+
+constexpr Part kParts[] = {
+    {"window-server", &Broken::windowServer},
+    {"display-query", &Broken::displayQuery},
+    {"process-lookup", &Broken::processLookUp},
+    {"event-records", &Broken::eventRecords},
+};
+
+void setBroken(const std::string& name, bool broken) {
+  for (const Part& part : kParts) {
+    if (part.name == name) {
+      desktop().broken.*part.flag = broken;
+      return;
+    }
+  }
+  throw UsageError("window-server, display-query, process-lookup or event-records can break, not " +
+                   quoted(name));
+}
+
+void breakPart(const Words& words) { setBroken(words.at(0), true); }
+
+void mendPart(const Words& words) { setBroken(words.at(0), false); }
+
+void answers(const Words& words) {
+  Application& application = installed(words.at(0));
+  if (words.at(1) == "normally") {
+    application.manner = Manner::Obeys;
+  } else if (words.at(1) == "nothing") {
+    application.manner = Manner::Ignores;
+  } else if (words.at(1) == "errors") {
+    application.manner = Manner::Refuses;
+  } else {
+    throw UsageError("an application answers normally, nothing or errors, not " + quoted(words.at(1)));
+  }
+}
+
+void version(const Words& words) {
+  Application& application = installed(words.at(0));
+  application.version = words.at(1) == "none" ? "" : words.at(1);
+}
+
+void disc(const Words& words) {
+  if (words.at(0) != "in" && words.at(0) != "out")
+    throw UsageError("a disc goes in or out, not " + quoted(words.at(0)));
+  for (const auto& application : desktop().installed) {
+    if (auto* const player = dynamic_cast<Spindle*>(application.get())) player->setDisc(words.at(0) == "in");
+  }
+}
+
+void displays(const Words& words) {
+  constexpr int kMost = 64;
+  const int count = remote::parseNumber<std::uint8_t>("a number of displays", words.at(0));
+  if (count > kMost) throw UsageError("there can be 0 to 64 displays, not " + words.at(0));
+  desktop().displays.resize(static_cast<std::size_t>(count));
+  for (std::size_t i = 0; i < desktop().displays.size(); ++i) {
+    desktop().displays[i].id = static_cast<HostDisplayID>(i + 1);
+  }
+}
+
+void capture(const Words& words) {
+  const auto number = remote::parseNumber<std::uint8_t>("a display", words.at(0));
+  if (number < 1 || number > desktop().displays.size())
+    throw UsageError("there is no display " + words.at(0));
+  desktop().displays[number - 1U].capturedByHand = onOrOff(words.at(1));
+}
 
 void show(const Words&) {
   for (const Process& process : desktop().running) {
@@ -198,7 +267,13 @@ constexpr Command kCommands[] = {
     {"tell", "APP to STATEMENT", "script an application yourself", 3, kAnyNumber, false, tell},
     {"volume", "0…100", "set the output volume", 1, 1, false, volume},
     {"mute", "on|off", "mute the output", 1, 1, false, mute},
-    {"window-server", "on|off", "whether the daemon finds a window server", 1, 1, false, windowServer},
+    {"answers", "APP normally|nothing|errors", "how an application treats scripts", 2, 2, false, answers},
+    {"version", "APP TEXT|none", "an application's version", 2, 2, false, version},
+    {"disc", "in|out", "the disc player's disc", 1, 1, false, disc},
+    {"displays", "N", "how many displays there are", 1, 1, false, displays},
+    {"capture", "N on|off", "whether a display is captured", 2, 2, false, capture},
+    {"break", "PART", "window-server, display-query, process-lookup, event-records", 1, 1, false, breakPart},
+    {"mend", "PART", "the same part works again", 1, 1, false, mendPart},
     {"show", "", "what runs, and how loud it is", 0, 0, false, show},
     {"wait", "TIME", "let time pass (2h, 10m, 1.5s, 20ms)", 1, 1, true, wait},
     {"start", "", "start the daemon, which else starts by itself", 0, 0, true, start},

@@ -5,9 +5,16 @@
 #include <algorithm>
 #include <string>
 
+#include "platform/scripting/movie_dictionaries.h"
 #include "platform/stage/journal.h"
+#include "platform/stage/keyhouse.h"
+#include "platform/stage/lumbra.h"
 #include "platform/stage/lyrabox.h"
+#include "platform/stage/movie_player.h"
 #include "platform/stage/script_world.h"
+#include "platform/stage/slidewell.h"
+#include "platform/stage/snapvale.h"
+#include "platform/stage/spindle.h"
 
 namespace stage {
 
@@ -29,7 +36,17 @@ Desktop& desktop() {
 }
 
 void setUpDesktop() {
-  desktop().installed.push_back(std::make_unique<Lyrabox>());
+  auto& installed = desktop().installed;
+  installed.push_back(std::make_unique<Lyrabox>());
+  installed.push_back(std::make_unique<Spindle>());
+  installed.push_back(std::make_unique<MoviePlayer>("com.tarn.vistremeplayer", "VistremePlayer", "7.6",
+                                                    scripting::movies::classicDictionary(), 256));
+  installed.push_back(std::make_unique<MoviePlayer>("com.tarn.VistremePlayerX", "VistremePlayerX", "10.0",
+                                                    scripting::movies::modernDictionary(), 1));
+  installed.push_back(std::make_unique<Slidewell>());
+  installed.push_back(std::make_unique<Snapvale>());
+  installed.push_back(std::make_unique<Lumbra>());
+  installed.push_back(std::make_unique<Keyhouse>());
   letScriptsFindApplications();
 }
 
@@ -90,7 +107,9 @@ void quitApplication(Application& application) {
   ++desktop().applicationListSeed;
   record(Entry::Change, application.name + " quits");
   if (desktop().front && sameProcess(desktop().front->serialNumber, oldest)) desktop().front.reset();
-  if (application.instances.empty()) application.ended();
+  if (!application.instances.empty()) return;
+  application.ended();
+  giveDisplayBack(application);
 }
 
 void bringToFront(Application& application) {
@@ -102,6 +121,20 @@ void bringToFront(Application& application) {
 }
 
 void clearFront() { desktop().front.reset(); }
+
+void takeDisplay(const Application& application) {
+  if (desktop().displays.empty()) return;
+  desktop().displays.front().holders.push_back(&application);
+  record(Entry::Change, application.name + " takes the display");
+}
+
+void giveDisplayBack(const Application& application) {
+  bool held = false;
+  for (Display& display : desktop().displays) {
+    held = std::erase(display.holders, &application) > 0 || held;
+  }
+  if (held) record(Entry::Change, application.name + " gives the display back");
+}
 
 void setOutputVolume(int volume) {
   const int previous = desktop().outputVolume;

@@ -19,8 +19,21 @@ struct Process {
 };
 
 struct Display {
-  HostDisplayID id;
-  bool captured;
+  HostDisplayID id = 0;
+  /// Captured by nobody in particular, as a command said.
+  bool capturedByHand = false;
+  /// The applications that have it for themselves.
+  std::vector<const Application*> holders;
+
+  bool captured() const { return capturedByHand || !holders.empty(); }
+};
+
+/// What of the desktop does not work.
+struct Broken {
+  bool windowServer = false;
+  bool displayQuery = false;
+  bool processLookUp = false;
+  bool eventRecords = false;
 };
 
 struct Desktop {
@@ -34,10 +47,10 @@ struct Desktop {
   int outputVolume = 50;  ///< 0 to 100
   bool outputMuted = false;
 
-  std::vector<Display> displays = {{1, false}};
+  /// The first is the one that slideshows take.
+  std::vector<Display> displays = std::vector<Display>(1, Display{1, false, {}});
 
-  /// False: nobody can connect to the window server.
-  bool windowServerUp = true;
+  Broken broken;
 };
 
 Desktop& desktop();
@@ -63,6 +76,10 @@ void quitApplication(Application& application);
 void bringToFront(Application& application);
 /// Leaves nobody in front.
 void clearFront();
+
+/// The first display becomes the application's own, or anybody's again.
+void takeDisplay(const Application& application);
+void giveDisplayBack(const Application& application);
 
 /// Sets the output volume, held between 0 and 100.
 void setOutputVolume(int volume);

@@ -64,9 +64,9 @@ void Fold::add(std::string text, Nanoseconds time) {
 void Fold::write(std::ostream& output, const std::vector<Item>& items, std::size_t indent) {
   for (const Item& item : items) {
     output << std::string(indent, ' ');
-    if (item.first > 0) output << '+' << timeText(item.first);
-    if (item.last > item.first) output << " to +" << timeText(item.last);
-    if (item.first > 0 || item.last > item.first) output << "  ";
+    const bool lasts = item.last > item.first;
+    if (item.first > 0 || lasts)
+      output << '+' << timeText(item.first) << (lasts ? " to +" + timeText(item.last) : "") << "  ";
     if (item.block.empty()) {
       output << item.text << '\n';
     } else if (item.block.size() == 1 && item.block.front().block.empty()) {

@@ -8,6 +8,7 @@
 #include "platform/host.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/journal.h"
+#include "platform/stage/virtual_keys.h"
 
 namespace {
 
@@ -64,7 +65,7 @@ void pressSoundKey(std::uint32_t data) {
 }  // namespace
 
 HostConnectionID HostConnectWindowServer() {
-  const bool up = stage::desktop().windowServerUp;
+  const bool up = !stage::desktop().broken.windowServer;
   record(Entry::Service, up ? "connects to the window server" : "finds no window server");
   return up ? kConnection : 0;
 }
@@ -86,6 +87,7 @@ std::int32_t HostClearEventRecord(void* eventRecord, std::uint32_t length) {
 std::int32_t HostPostEventRecord(HostConnectionID connection, const void* eventRecord, std::uint32_t length,
                                  std::int32_t) {
   if (connection != kConnection || eventRecord == nullptr || length != kRecordLength) return -1;
+  if (stage::desktop().broken.eventRecords) return -1;
   if (fieldAt<std::uint32_t>(eventRecord, kTypeOffset) == kSystemDefined &&
       fieldAt<std::uint16_t>(eventRecord, kSubtypeOffset) == kAuxiliaryControlButton) {
     pressSoundKey(fieldAt<std::uint32_t>(eventRecord, kDataOffset));
@@ -106,11 +108,18 @@ void HostPostEventToProcess(const HostProcessSerialNumber& serialNumber, HostKey
   if (key == nullptr || process == nullptr) return;
   record(Entry::Key, "key " + std::to_string(key->virtualKey) +
                          (key->down ? " pressed in " : " released in ") + process->application->name);
+  static bool sShiftIsDown = false;
+  if (key->virtualKey == stage::keys::kShift) {
+    sShiftIsDown = key->down;
+  } else if (key->down) {
+    process->application->receiveKey(key->virtualKey, sShiftIsDown);
+  }
 }
 
 std::int32_t HostFindProcessByBundleIdentifier(HostStringRef bundleIdentifier, std::uint32_t,
                                                HostProcessSerialNumber* serialNumber, std::uint8_t* found) {
   *found = 0;
+  if (stage::desktop().broken.processLookUp) return -1;
   for (const stage::Process& process : stage::desktop().running) {
     if (process.application->identifier != base::textOf(bundleIdentifier)) continue;
     *serialNumber = process.serialNumber;
@@ -122,6 +131,7 @@ std::int32_t HostFindProcessByBundleIdentifier(HostStringRef bundleIdentifier, s
 
 std::int32_t HostGetActiveDisplayList(std::uint32_t capacity, HostDisplayID* displays, std::uint32_t* count) {
   *count = 0;
+  if (stage::desktop().broken.displayQuery) return -1;
   for (const stage::Display& display : stage::desktop().displays) {
     if (*count == capacity) break;
     displays[(*count)++] = display.id;
@@ -132,5 +142,5 @@ std::int32_t HostGetActiveDisplayList(std::uint32_t capacity, HostDisplayID* dis
 std::uint32_t HostDisplayIsCaptured(HostDisplayID id) {
   const auto& displays = stage::desktop().displays;
   return std::any_of(displays.begin(), displays.end(),
-                     [&](const stage::Display& display) { return display.id == id && display.captured; });
+                     [&](const stage::Display& display) { return display.id == id && display.captured(); });
 }

@@ -1,6 +1,8 @@
 #include "platform/stage/journal.h"
 
+#include <algorithm>
 #include <optional>
+#include <string_view>
 #include <utility>
 
 namespace stage {
@@ -16,6 +18,39 @@ void send(const JournalLine& line) {
   if (sListener) sListener(line);
 }
 
+/// What is written of a script's body, in bytes; the longest ones have a kilobyte.
+constexpr std::size_t kLongestBody = 100;
+
+/// "script to Spindle: play dvd" for the tell of one line and of several.
+std::string shortened(std::string_view source) {
+  std::string addressee;
+  std::string_view body = source;
+  const std::size_t open = source.find('"');
+  const std::size_t close = source.find('"', open + 1);
+  if (source.starts_with("tell application") && close != std::string_view::npos) {
+    const std::string_view identifier = source.substr(open + 1, close - open - 1);
+    addressee = " to " + std::string(identifier.substr(identifier.rfind('.') + 1));
+    body = source.substr(close + 1);
+    if (body.starts_with(" to ")) {
+      body.remove_prefix(4);
+    } else {
+      body = body.substr(0, body.rfind('\n'));
+      body.remove_prefix(std::min<std::size_t>(body.size(), 1));
+    }
+  }
+  std::string text = "script" + addressee + ": ";
+  const std::size_t longest = text.size() + kLongestBody;
+  for (const char c : body) {
+    if (c == '\n') {
+      text += " ⏎ ";
+    } else {
+      text += c;
+    }
+    if (text.size() > longest) return text + "…";
+  }
+  return text;
+}
+
 void closeScript() {
   if (!sOpenScript) return;
   const JournalLine line = *std::exchange(sOpenScript, std::nullopt);
@@ -28,20 +63,12 @@ void setJournalListener(std::function<void(const JournalLine&)> listener) { sLis
 
 void record(Entry kind, std::string text) {
   closeScript();
-  send({kind, std::move(text), now()});
+  send({kind, std::move(text), now(), {}});
 }
 
 void recordScriptStart(const std::string& source) {
   closeScript();
-  std::string text = "script: ";
-  for (const char c : source) {
-    if (c == '\n') {
-      text += " ⏎ ";
-    } else {
-      text += c;
-    }
-  }
-  sOpenScript = {Entry::Script, std::move(text), now()};
+  sOpenScript = {Entry::Script, shortened(source), now(), source};
 }
 
 void recordScriptEnd(const std::string& answer) {

@@ -26,12 +26,14 @@ struct JournalLine {
   Entry kind;
   std::string text;
   Nanoseconds time;
+  /// Of a script: its whole source.
+  std::string source;
 };
 
 /// Writes one line.
 void record(Entry kind, std::string text);
 
-/// Writes that a script runs; what it answered follows with recordScriptEnd, on the same line if nothing else
+/// Writes that a script runs, shortened for people: to whom, and what. What it answered follows with recordScriptEnd, on the same line if nothing else
 /// happened in between.
 void recordScriptStart(const std::string& source);
 /// An empty answer is none.

@@ -33,22 +33,14 @@ constexpr std::uint32_t kRemoteSelectEvent = words::code("RSel");
 
 double inSeconds(Nanoseconds time) { return static_cast<double>(time) / static_cast<double>(kSecond); }
 
-std::string clockText(Nanoseconds time) {
-  const Nanoseconds seconds = time / kSecond;
-  const std::string rest = std::to_string(seconds % 60);
-  return std::to_string(seconds / 60) + (rest.size() < 2 ? ":0" : ":") + rest;
-}
-
 }  // namespace
 
 Lyrabox::Lyrabox() : Application("com.tarn.Lyrabox", "Lyrabox", "4.2") {}
 
 const tarnscript::Dictionary& Lyrabox::dictionary() const { return words::dictionary(); }
 
-ObjectRef Lyrabox::track(std::size_t index) { return {this, words::kTrack, index + 1}; }
-
-int Lyrabox::speed() const {
-  switch (state_) {
+double Lyrabox::rateOf(State state) {
+  switch (state) {
     case State::Playing:
       return 1;
     case State::FastForwarding:
@@ -62,28 +54,21 @@ int Lyrabox::speed() const {
   return 0;
 }
 
+ObjectRef Lyrabox::track(std::size_t index) { return {this, words::kTrack, index + 1}; }
+
 Nanoseconds Lyrabox::duration() const { return kTracks[current_].seconds * kSecond; }
 
-std::optional<Nanoseconds> Lyrabox::nextChange() const {
-  const int rate = speed();
-  if (rate == 0) return std::nullopt;
-  const Nanoseconds left = rate > 0 ? duration() - position_ : position_;
-  const int magnitude = rate > 0 ? rate : -rate;
-  return since_ + (left + magnitude - 1) / magnitude;
-}
+std::optional<Nanoseconds> Lyrabox::nextChange() const { return playhead_.arrival(duration()); }
 
 void Lyrabox::advance() {
-  for (auto change = nextChange(); change && *change <= now(); change = nextChange()) {
-    since_ = *change;
-    if (speed() > 0) {
-      nextTrack();
+  for (auto end = nextChange(); end && *end <= now(); end = nextChange()) {
+    if (playhead_.rate() > 0) {
+      nextTrack(*end);
     } else {
-      position_ = 0;
-      enter(beforeScan_);
+      playhead_.seek(0, *end);
+      enter(beforeScan_, *end);
     }
   }
-  position_ += speed() * (now() - since_);
-  since_ = now();
 }
 
 std::string Lyrabox::describe() const {
@@ -94,7 +79,7 @@ std::string Lyrabox::describe() const {
     case State::Playing:
       return "plays " + title;
     case State::Paused:
-      return "paused in " + title + " at " + clockText(position_);
+      return "paused in " + title + " at " + positionText(playhead_.position());
     case State::FastForwarding:
       return "scans forward through " + title;
     case State::Rewinding:
@@ -103,9 +88,10 @@ std::string Lyrabox::describe() const {
   return {};
 }
 
-void Lyrabox::enter(State state) {
+void Lyrabox::enter(State state, Nanoseconds when) {
   if (state == state_) return;
   state_ = state;
+  playhead_.setRate(rateOf(state), when);
   changed(describe());
 }
 
@@ -115,32 +101,29 @@ void Lyrabox::scan(State direction) {
   enter(direction);
 }
 
-void Lyrabox::goTo(std::size_t index, Nanoseconds position) {
+void Lyrabox::goTo(std::size_t index, Nanoseconds when) {
   current_ = index;
-  position_ = position;
+  playhead_.seek(0, when);
   changed(state_ == State::Stopped ? std::string("chooses \"") + kTracks[current_].name + '"' : describe());
 }
 
-void Lyrabox::nextTrack() {
-  if (current_ + 1 < std::size(kTracks)) {
-    goTo(current_ + 1, 0);
-  } else {
-    current_ = 0;
-    stop();
-  }
+void Lyrabox::nextTrack(Nanoseconds when) {
+  if (current_ + 1 < std::size(kTracks)) return goTo(current_ + 1, when);
+  current_ = 0;
+  stop();
 }
 
 void Lyrabox::backTrack() {
-  const bool restart = position_ > kRestartThreshold || current_ == 0;
-  goTo(restart ? current_ : current_ - 1, 0);
+  const bool restart = playhead_.position() > kRestartThreshold || current_ == 0;
+  goTo(restart ? current_ : current_ - 1);
 }
 
 void Lyrabox::stop() {
-  position_ = 0;
+  playhead_.seek(0);
   enter(State::Stopped);
 }
 
-Value Lyrabox::get(const ObjectRef& object, tarnscript::Code property) {
+Value Lyrabox::read(const ObjectRef& object, tarnscript::Code property) {
   if (object.cls == words::kTrack) {
     const Track& item = kTracks[object.id - 1];
     if (property == words::kName) return std::string(item.name);
@@ -163,7 +146,7 @@ Value Lyrabox::get(const ObjectRef& object, tarnscript::Code property) {
       break;
     }
     case words::kPlayerPosition:
-      return inSeconds(position_);
+      return inSeconds(playhead_.position());
     case words::kSoundVolume:
       return std::int64_t{volume_};
     case words::kCurrentTrack:
@@ -171,10 +154,10 @@ Value Lyrabox::get(const ObjectRef& object, tarnscript::Code property) {
     default:
       break;
   }
-  return Application::get(object, property);
+  return Application::read(object, property);
 }
 
-void Lyrabox::set(const ObjectRef& object, tarnscript::Code property, const Value& value) {
+void Lyrabox::write(const ObjectRef& object, tarnscript::Code property, const Value& value) {
   if (object.cls != tarnscript::kApplicationClass) throw tarnscript::Refusal{"tracks cannot be changed"};
   if (property == words::kSoundVolume) {
     const int previous = volume_;
@@ -188,31 +171,31 @@ void Lyrabox::set(const ObjectRef& object, tarnscript::Code property, const Valu
     const auto* seconds = std::get_if<double>(&value);
     if (seconds == nullptr) throw tarnscript::Refusal{"a position is a number of seconds"};
     const double held = std::clamp(*seconds, 0.0, inSeconds(duration()));
-    position_ = static_cast<Nanoseconds>(held * static_cast<double>(kSecond));
-    changed("goes to " + clockText(position_));
+    playhead_.seek(static_cast<Nanoseconds>(held * static_cast<double>(kSecond)));
+    changed("goes to " + positionText(playhead_.position()));
     return;
   }
   throw tarnscript::Refusal{"this property cannot be set"};
 }
 
-std::vector<ObjectRef> Lyrabox::elements(const ObjectRef& object, tarnscript::Code cls) {
+std::vector<ObjectRef> Lyrabox::list(const ObjectRef& object, tarnscript::Code cls) {
   if (object.cls != tarnscript::kApplicationClass || cls != words::kTrack) {
-    return Application::elements(object, cls);
+    return Application::list(object, cls);
   }
   std::vector<ObjectRef> tracks;
   for (std::size_t i = 0; i < std::size(kTracks); ++i) tracks.push_back(track(i));
   return tracks;
 }
 
-ObjectRef Lyrabox::elementWithID(const ObjectRef& object, tarnscript::Code cls, const Value& id) {
+ObjectRef Lyrabox::find(const ObjectRef& object, tarnscript::Code cls, const Value& id) {
   const auto* number = std::get_if<std::int64_t>(&id);
-  for (const ObjectRef& item : elements(object, cls)) {
+  for (const ObjectRef& item : list(object, cls)) {
     if (number != nullptr && static_cast<std::int64_t>(item.id) == *number) return item;
   }
   throw tarnscript::Refusal{"there is no such track"};
 }
 
-Value Lyrabox::perform(const tarnscript::Event& event) {
+Value Lyrabox::obey(const tarnscript::Event& event) {
   switch (event.command) {
     case words::kPlay: {
       if (event.direct) {
@@ -221,8 +204,7 @@ Value Lyrabox::perform(const tarnscript::Event& event) {
           throw tarnscript::Refusal{"only tracks can be played"};
         }
         current_ = wanted->id - 1;
-        position_ = 0;
-        state_ = State::Stopped;
+        stop();
       }
       enter(State::Playing);
       break;
@@ -252,7 +234,7 @@ Value Lyrabox::perform(const tarnscript::Event& event) {
       backTrack();
       break;
     default:
-      return Application::perform(event);
+      return Application::obey(event);
   }
   return {};
 }
@@ -260,7 +242,7 @@ Value Lyrabox::perform(const tarnscript::Event& event) {
 void Lyrabox::receiveEvent(std::uint32_t eventClass, std::uint32_t eventID) {
   if (eventClass != kHookClass || eventID != kRemoteSelectEvent) return;
   advance();
-  position_ = 0;
+  playhead_.seek(0);
   if (state_ == State::Playing) {
     changed("starts \"" + std::string(kTracks[current_].name) + "\" again");
   } else {
@@ -270,7 +252,7 @@ void Lyrabox::receiveEvent(std::uint32_t eventClass, std::uint32_t eventID) {
 
 void Lyrabox::ended() {
   state_ = State::Stopped;
-  position_ = 0;
+  playhead_ = {};
 }
 
 }  // namespace stage

@@ -4,6 +4,7 @@
 #include <string>
 
 #include "platform/stage/application.h"
+#include "platform/stage/playhead.h"
 
 namespace stage {
 
@@ -12,14 +13,6 @@ class Lyrabox final : public Application {
   Lyrabox();
 
   const tarnscript::Dictionary& dictionary() const override;
-  tarnscript::Value get(const tarnscript::ObjectRef& object, tarnscript::Code property) override;
-  void set(const tarnscript::ObjectRef& object, tarnscript::Code property,
-           const tarnscript::Value& value) override;
-  std::vector<tarnscript::ObjectRef> elements(const tarnscript::ObjectRef& object,
-                                              tarnscript::Code cls) override;
-  tarnscript::ObjectRef elementWithID(const tarnscript::ObjectRef& object, tarnscript::Code cls,
-                                      const tarnscript::Value& id) override;
-  tarnscript::Value perform(const tarnscript::Event& event) override;
   /// Its remote interface's select: plays the current track from the start.
   void receiveEvent(std::uint32_t eventClass, std::uint32_t eventID) override;
   void ended() override;
@@ -27,18 +20,26 @@ class Lyrabox final : public Application {
   void advance() override;
   std::string describe() const override;
 
+ protected:
+  tarnscript::Value read(const tarnscript::ObjectRef& object, tarnscript::Code property) override;
+  void write(const tarnscript::ObjectRef& object, tarnscript::Code property,
+             const tarnscript::Value& value) override;
+  std::vector<tarnscript::ObjectRef> list(const tarnscript::ObjectRef& object, tarnscript::Code cls) override;
+  tarnscript::ObjectRef find(const tarnscript::ObjectRef& object, tarnscript::Code cls,
+                             const tarnscript::Value& id) override;
+  tarnscript::Value obey(const tarnscript::Event& event) override;
+
  private:
   enum class State { Stopped, Playing, Paused, FastForwarding, Rewinding };
 
+  static double rateOf(State state);
   tarnscript::ObjectRef track(std::size_t index);
-  /// Seconds of the track that pass in a second.
-  int speed() const;
   bool scanning() const { return state_ == State::FastForwarding || state_ == State::Rewinding; }
   Nanoseconds duration() const;
-  void enter(State state);
+  void enter(State state, Nanoseconds when = now());
   void scan(State direction);
-  void goTo(std::size_t index, Nanoseconds position);
-  void nextTrack();
+  void goTo(std::size_t index, Nanoseconds when = now());
+  void nextTrack(Nanoseconds when = now());
   void backTrack();
   void stop();
 
@@ -46,9 +47,7 @@ class Lyrabox final : public Application {
   /// What a scan goes back to.
   State beforeScan_ = State::Playing;
   std::size_t current_ = 0;
-  /// Where in the track it was at `since_`.
-  Nanoseconds position_ = 0;
-  Nanoseconds since_ = 0;
+  Playhead playhead_;
   int volume_ = 60;  ///< 0 to 100
 };
 

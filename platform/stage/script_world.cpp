@@ -23,17 +23,19 @@ class Additions final : public Application {
   Additions() : Application("", "the desktop", "") {}
   const tarnscript::Dictionary& dictionary() const override { return words::dictionary(); }
   bool running() const override { return true; }
-  Value perform(const tarnscript::Event& event) override;
+
+ protected:
+  Value obey(const tarnscript::Event& event) override;
 };
 
-Value Additions::perform(const tarnscript::Event& event) {
+Value Additions::obey(const tarnscript::Event& event) {
   if (event.command == words::kGetVolumeSettings) {
     return std::make_shared<const std::map<tarnscript::Code, Value>>(std::map<tarnscript::Code, Value>{
         {words::kOutputVolume, std::int64_t{desktop().outputVolume}},
         {words::kOutputMuted, desktop().outputMuted},
     });
   }
-  if (event.command != words::kSetVolume) return Application::perform(event);
+  if (event.command != words::kSetVolume) return Application::obey(event);
   const auto volume = event.parameters.find(words::kOutputVolume);
   if (volume != event.parameters.end()) setOutputVolume(tarnscript::toInt32(volume->second));
   const auto muted = event.parameters.find(words::kOutputMuted);

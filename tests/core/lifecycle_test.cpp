@@ -19,9 +19,10 @@ TEST(Start, FailsBeforeAnythingIsAnnounced) {
             }),
             "1")
       << "no check-in";
-  EXPECT_EQ(transcriptOf("window-server off\ntap play\nwait 1h\n"),
-            "window-server off\ntap play\n  finds no window server\n  exit status 1\n  nobody is listening\n"
-            "wait 1h\n  left alive: nothing\n");
+  EXPECT_EQ(
+      transcriptOf("break window-server\ntap play\nwait 1h\n"),
+      "break window-server\ntap play\n  finds no window server\n  exit status 1\n  nobody is listening\n"
+      "wait 1h\n  left alive: nothing\n");
 }
 
 TEST(Run, TakesThePortOffTheLoopDuringADispatchOnly) {

@@ -23,13 +23,7 @@ std::string sSent;
 void listen(const stage::JournalLine& line) {
   sJournal += line.text + "\n";
   if (line.kind != stage::Entry::Script && line.kind != stage::Entry::Event) return;
-  constexpr std::string_view kAddress = "script: tell application id \"com.tarn.Lyrabox\" ";
-  std::string_view text = line.text;
-  if (text.starts_with(kAddress)) text.remove_prefix(kAddress.size());
-  for (const std::string_view joint : {"to ", "⏎ "}) {
-    if (text.starts_with(joint)) text.remove_prefix(joint.size());
-  }
-  sSent += std::string(text) + "; ";
+  sSent += (line.kind == stage::Entry::Script ? line.source : line.text) + "; ";
 }
 
 std::string readAll(int descriptor) {

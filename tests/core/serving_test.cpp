@@ -112,10 +112,10 @@ TEST_F(Serving, LosesNothingInAFloodAndLeaksNothing) {
   EXPECT_EQ(finish(),
             "  ×50000:\n"
             "    asks who is in front: Lyrabox\n"
-            "    script: tell application id \"com.tarn.Lyrabox\" to playpause\n"
+            "    script to Lyrabox: playpause\n"
             "    Lyrabox: plays \"Harbour Lights\"\n"
             "    asks who is in front: Lyrabox\n"
-            "    script: tell application id \"com.tarn.Lyrabox\" to playpause\n"
+            "    script to Lyrabox: playpause\n"
             "    Lyrabox: paused in \"Harbour Lights\" at 0:00\n" +
                 std::string(kEnd));
   EXPECT_EQ(kvd_terminate(port_), MACH_SEND_INVALID_DEST) << "nobody is behind the port any more";
@@ -142,7 +142,7 @@ TEST_F(Serving, PassesOverMalformedMessages) {
   ASSERT_EQ(kvd_terminate(port_), MACH_MSG_SUCCESS);
   EXPECT_EQ(finish(),
             "  asks who is in front: Lyrabox\n"
-            "  script: tell application id \"com.tarn.Lyrabox\" to stop\n" +
+            "  script to Lyrabox: stop\n" +
                 std::string(kEnd));
 }
 

@@ -6,7 +6,7 @@ tap play
   timer of 10m starts
   notification com.tarn.kvd.started of com.tarn.kvd
   asks who is in front: nobody ×7
-  script: tell application id "com.tarn.Lyrabox" to launch
+  script to Lyrabox: launch
   Lyrabox starts
 
 # The second one plays, and the third pauses: Play toggles.
@@ -14,43 +14,43 @@ tap play
   finds Lyrabox running
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSS'
+  script to Lyrabox: get player state = 'kPSS'
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to playpause
+  script to Lyrabox: playpause
   Lyrabox: plays "Harbour Lights"
 wait 30s
 tap play
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSP'
-  script: tell application id "com.tarn.Lyrabox" to playpause
+  script to Lyrabox: get player state = 'kPSP'
+  script to Lyrabox: playpause
   Lyrabox: paused in "Harbour Lights" at 0:30
 tap play
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSU'
+  script to Lyrabox: get player state = 'kPSU'
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to playpause
+  script to Lyrabox: playpause
   Lyrabox: plays "Harbour Lights"
 
 # A scan lasts while the button is held.
 hold forward 3s
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSP'
-  script: tell application id "com.tarn.Lyrabox" to fast forward
+  script to Lyrabox: get player state = 'kPSP'
+  script to Lyrabox: fast forward
   Lyrabox: scans forward through "Harbour Lights"
   +3s  asks who is in front: nobody
   +3s  asks whether Lyrabox runs: yes
-  +3s  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSF'
+  +3s  script to Lyrabox: get player state = 'kPSF'
   +3s  asks whether Lyrabox runs: yes
-  +3s  script: tell application id "com.tarn.Lyrabox" to resume
+  +3s  script to Lyrabox: resume
   +3s  Lyrabox: plays "Harbour Lights"
 tap stop
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSP'
-  script: tell application id "com.tarn.Lyrabox" to stop
+  script to Lyrabox: get player state = 'kPSP'
+  script to Lyrabox: stop
   Lyrabox: stopped
   end of input
   notification com.tarn.kvd.terminated of com.tarn.kvd

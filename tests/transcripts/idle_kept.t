@@ -10,7 +10,7 @@ wait 1h
   +10m to +1h  asks who is in front: nobody ×36
 release play
   asks who is in front: nobody
-  script: tell application id "com.tarn.Lyrabox" to launch
+  script to Lyrabox: launch
   Lyrabox starts
 wait 2h
   +10m to +2h  asks who is in front: nobody ×72

@@ -11,33 +11,33 @@ tap playpause
   timer of 10m starts
   notification com.tarn.kvd.started of com.tarn.kvd
   asks who is in front: Lyrabox ×3
-  script: tell application id "com.tarn.Lyrabox" to playpause
+  script to Lyrabox: playpause
   Lyrabox: plays "Harbour Lights"
 tap next
   asks who is in front: Lyrabox
-  script: tell application id "com.tarn.Lyrabox" to next track
+  script to Lyrabox: next track
   Lyrabox: plays "Paper Boats"
 wait 2s
 tap left
   asks who is in front: Lyrabox
-  script: tell application id "com.tarn.Lyrabox" to back track
+  script to Lyrabox: back track
   Lyrabox: plays "Harbour Lights"
 wait 10s
 tap menu-left
   asks who is in front: Lyrabox
-  script: tell application id "com.tarn.Lyrabox" to back track
+  script to Lyrabox: back track
   Lyrabox: plays "Harbour Lights"
 wait 20s
 hold rewind 1s
   asks who is in front: Lyrabox
-  script: tell application id "com.tarn.Lyrabox" to rewind
+  script to Lyrabox: rewind
   Lyrabox: scans back through "Harbour Lights"
   +1s  asks who is in front: Lyrabox
-  +1s  script: tell application id "com.tarn.Lyrabox" to resume
+  +1s  script to Lyrabox: resume
   +1s  Lyrabox: plays "Harbour Lights"
 tap pause
   asks who is in front: Lyrabox
-  script: tell application id "com.tarn.Lyrabox" ⏎ if player state is playing then ⏎ pause ⏎ end if ⏎ end
+  script to Lyrabox: if player state is playing then ⏎ pause ⏎ end if
   Lyrabox: paused in "Harbour Lights" at 0:12
 
 # Menu Pick is the one button that sends an event.

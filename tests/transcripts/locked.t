@@ -15,7 +15,7 @@ tap next
   asks who is in front: nobody
 raw 0x01 0x89 0
   asks who is in front: nobody
-  script: tell application id "com.tarn.Lyrabox" to launch
+  script to Lyrabox: launch
   Lyrabox starts
 
 # It does not keep it from driving what runs.
@@ -24,9 +24,9 @@ tap play
   finds Lyrabox running
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSS'
+  script to Lyrabox: get player state = 'kPSS'
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to playpause
+  script to Lyrabox: playpause
   Lyrabox: plays "Harbour Lights"
   end of input
   notification com.tarn.kvd.terminated of com.tarn.kvd

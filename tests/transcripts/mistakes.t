@@ -16,7 +16,7 @@ open lyrabox
 open lyrabox
   error: Lyrabox runs already; 'again' starts it once more
 front spindle
-  error: no application is called 'spindle'
+  error: Spindle does not run
 wait soon
   error: not a time: 'soon' (2s, 500ms, 1.5s, 2h10m)
 wait 400d
@@ -35,9 +35,9 @@ tap play
   finds Lyrabox running
   asks who is in front: nobody
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to get player state = 'kPSS'
+  script to Lyrabox: get player state = 'kPSS'
   asks whether Lyrabox runs: yes
-  script: tell application id "com.tarn.Lyrabox" to playpause
+  script to Lyrabox: playpause
   Lyrabox: plays "Harbour Lights"
 quit
   notification com.tarn.kvd.terminated of com.tarn.kvd
