@@ -102,7 +102,7 @@ TEST(Registry, ReadsTheMajorVersion) {
               getSnapvaleVersion();
               return stage::aliveText();
             }),
-            "string ×2, list ×1, serial number ×1");
+            "string ×3, list ×1, serial number ×1");
 }
 
 TEST(Registry, ReadsAPropertyListFromABundle) {
