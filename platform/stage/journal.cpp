@@ -72,11 +72,17 @@ void recordScriptStart(const std::string& source) {
 }
 
 void recordScriptEnd(const std::string& answer) {
+  if (sOpenScript && !answer.empty()) sOpenScript->text += " = " + answer;
+  closeScript();
+}
+
+void recordScriptFailure(const std::string& message, int line) {
+  const std::string failure = "fails in line " + std::to_string(line) + ": " + message;
   if (sOpenScript) {
-    if (!answer.empty()) sOpenScript->text += " = " + answer;
+    sOpenScript->text += ", " + failure;
     closeScript();
-  } else if (!answer.empty()) {
-    record(Entry::Answer, "= " + answer);
+  } else {
+    record(Entry::Failure, "the script " + failure);
   }
 }
 

@@ -11,7 +11,7 @@ namespace stage {
 enum class Entry {
   Question,      ///< something the daemon asked
   Script,        ///< a script, with what it answered
-  Answer,        ///< what a script answered, where other things happened in between
+  Failure,       ///< why a script failed, where other things happened in between
   Event,         ///< an inter-application event
   Key,           ///< a key posted to a process
   SoundKey,      ///< a sound key posted to the window server
@@ -33,11 +33,12 @@ struct JournalLine {
 /// Writes one line.
 void record(Entry kind, std::string text);
 
-/// Writes that a script runs, shortened for people: to whom, and what. What it answered follows with recordScriptEnd, on the same line if nothing else
-/// happened in between.
+/// Writes that a script runs, shortened for people: to whom, and what.
 void recordScriptStart(const std::string& source);
-/// An empty answer is none.
+/// Writes that it ended: behind its own line where nothing else happened in between. An answer that comes
+/// behind changes is left out, for the changes tell it; a failure is not.
 void recordScriptEnd(const std::string& answer);
+void recordScriptFailure(const std::string& message, int line);
 
 /// Where the lines go, one listener at a time.
 void setJournalListener(std::function<void(const JournalLine& line)> listener);

@@ -59,10 +59,6 @@ World& world() {
   return instance;
 }
 
-std::string describeError(const tarnscript::Error& error) {
-  return "error on line " + std::to_string(error.line) + ": " + error.message;
-}
-
 struct Describe {
   std::string operator()(std::monostate) const { return {}; }
   std::string operator()(bool value) const { return value ? "true" : "false"; }
@@ -94,7 +90,11 @@ void letScriptsFindApplications() {
       &world(),
       recordScriptStart,
       [](const tarnscript::Outcome& outcome) {
-        recordScriptEnd(outcome.error ? describeError(*outcome.error) : describe(outcome.value));
+        if (outcome.error) {
+          recordScriptFailure(outcome.error->message, outcome.error->line);
+        } else {
+          recordScriptEnd(describe(outcome.value));
+        }
       },
   });
 }

@@ -172,9 +172,9 @@ TEST(Lyrabox, OffersCommandsAndQueriesToOthers) {
             }),
             "kPSP plays; kPSU silent; .... silent; "
             "script to Lyrabox: set sound volume to sound volume + 2\n"
-            "Lyrabox: volume 60 → 62\n= 62\n"
+            "Lyrabox: volume 60 → 62\n"
             "script to Lyrabox: set sound volume to sound volume - 2\n"
-            "Lyrabox: volume 62 → 60\n= 60\n");
+            "Lyrabox: volume 62 → 60\n");
 }
 
 }  // namespace
