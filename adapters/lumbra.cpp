@@ -1,21 +1,12 @@
 #include "adapters/lumbra.h"
 
+#include "adapters/virtual_keys.h"
 #include "daemon/kvd.h"
 #include "routing/display.h"
 #include "routing/keys.h"
 #include "routing/silence.h"
 
 namespace {
-
-// Virtual key codes.
-constexpr std::uint16_t kS = 1;
-constexpr std::uint16_t kReturn = 36;
-constexpr std::uint16_t kSpace = 49;
-constexpr std::uint16_t kEscape = 53;
-constexpr std::uint16_t kLeftArrow = 123;
-constexpr std::uint16_t kRightArrow = 124;
-constexpr std::uint16_t kDownArrow = 125;
-constexpr std::uint16_t kUpArrow = 126;
 
 constexpr std::uint32_t kBeforeReturn = 10'000;  // microseconds
 
@@ -27,13 +18,13 @@ bool Nothing(std::int32_t) { return true; }
 
 bool StartOrPause(std::int32_t) {
   if (AnyDisplayIsCaptured()) {
-    Post(kSpace);
+    Post(VirtualKey::Space);
     return true;
   }
   SilenceAllBut(App::Lumb);
-  Post(kS, true);
+  Post(VirtualKey::S, true);
   HostSleepMicroseconds(kBeforeReturn);
-  Post(kReturn);
+  Post(VirtualKey::Return);
   return true;
 }
 
@@ -66,14 +57,14 @@ constexpr Row kButtons[] = {
     {Key::Undefined, Nothing},
     {Key::SystemAppMenu, Nothing},
     {Key::SystemMenuSelect, StartOrPause},
-    {Key::SystemMenuRight, Step<kRightArrow>},
-    {Key::SystemMenuLeft, Step<kLeftArrow>},
-    {Key::SystemMenuUp, Move<kUpArrow>},
-    {Key::SystemMenuDown, Move<kDownArrow>},
+    {Key::SystemMenuRight, Step<VirtualKey::RightArrow>},
+    {Key::SystemMenuLeft, Step<VirtualKey::LeftArrow>},
+    {Key::SystemMenuUp, Move<VirtualKey::UpArrow>},
+    {Key::SystemMenuDown, Move<VirtualKey::DownArrow>},
     {Key::Menu, Exit},
     {Key::MenuPick, Nothing},
-    {Key::FastForward, Step<kRightArrow>},
-    {Key::Rewind, Step<kLeftArrow>},
+    {Key::FastForward, Step<VirtualKey::RightArrow>},
+    {Key::Rewind, Step<VirtualKey::LeftArrow>},
     {Key::Stop, Exit},
     {Key::PlayPause, StartOrPause},
 };
@@ -89,5 +80,5 @@ bool LumbraHandleHIDEvent(std::uint32_t usagePage, std::uint32_t usage, std::int
 }
 
 void LumbraCommand_ExitSlideShow() {
-  if (AnyDisplayIsCaptured()) Post(kEscape);
+  if (AnyDisplayIsCaptured()) Post(VirtualKey::Escape);
 }

@@ -1,6 +1,7 @@
 #include "adapters/snapvale.h"
 
 #include "adapters/snapvale_scripts.h"
+#include "adapters/virtual_keys.h"
 #include "daemon/kvd.h"
 #include "registry/bridge.h"
 #include "registry/registry.h"
@@ -11,13 +12,6 @@
 namespace {
 
 namespace scripts = snapvale_scripts;
-
-// Virtual key codes.
-constexpr std::uint16_t kReturn = 36;
-constexpr std::uint16_t kSpace = 49;
-constexpr std::uint16_t kEscape = 53;
-constexpr std::uint16_t kLeftArrow = 123;
-constexpr std::uint16_t kRightArrow = 124;
 
 /// What is asked of the application at every button.
 struct Situation {
@@ -34,7 +28,7 @@ bool Nothing(const Situation&) { return true; }
 
 bool Play(const Situation& situation) {
   if (AnyDisplayIsCaptured()) {
-    Post(kSpace);
+    Post(VirtualKey::Space);
     return true;
   }
   SilenceAllBut(App::Snap);
@@ -49,11 +43,11 @@ bool Play(const Situation& situation) {
 bool Menu(const Situation& situation) {
   if (!situation.isModern()) {
     if (!AnyDisplayIsCaptured()) return Play(situation);
-    Post(kReturn);
+    Post(VirtualKey::Return);
     return true;
   }
   if (AnyDisplayIsCaptured()) {
-    Post(kEscape);
+    Post(VirtualKey::Escape);
     return true;
   }
   SilenceAllBut(App::Snap);
@@ -74,9 +68,11 @@ bool Step(const Situation& situation, std::uint16_t arrow, const scripts::Genera
   return true;
 }
 
-bool Next(const Situation& situation) { return Step(situation, kRightArrow, scripts::kNextAlbum); }
+bool Next(const Situation& situation) { return Step(situation, VirtualKey::RightArrow, scripts::kNextAlbum); }
 
-bool Previous(const Situation& situation) { return Step(situation, kLeftArrow, scripts::kPreviousAlbum); }
+bool Previous(const Situation& situation) {
+  return Step(situation, VirtualKey::LeftArrow, scripts::kPreviousAlbum);
+}
 
 bool AppMenu(const Situation& situation) {
   const bool captured = AnyDisplayIsCaptured();
