@@ -49,7 +49,7 @@ Value Keyhouse::obey(const tarnscript::Event& event) {
   if (used != event.parameters.end()) modifier = tarnscript::toTypeCode(used->second);
   std::string text = std::to_string(key);
   for (const Modifier& row : kModifiers) {
-    if (row.code == modifier) text = row.name + text;
+    if (row.code == modifier) text.insert(0, row.name);
   }
 
   // Outside a process the key goes where the keyboard goes.
