@@ -5,6 +5,8 @@
 #include <gtest/gtest.h>
 #include <stdlib.h>
 
+#include <filesystem>
+
 #include "platform/base/run_loop.h"
 #include "platform/stage/journal.h"
 #include "registry/registry.h"
@@ -33,12 +35,11 @@ TEST(Run, TakesThePortOffTheLoopDuringADispatchOnly) {
       if (line.kind == stage::Entry::Question) onLoop += source != nullptr && source->onLoop ? "+" : "-";
     });
     set("open lyrabox; front lyrabox");
-    const char directory[] = "/tmp/kvd-test-XXXXXX";
-    std::string path = directory;
+    std::string path = std::filesystem::temp_directory_path() / "kvd-test-XXXXXX";
     setenv("XDG_RUNTIME_DIR", mkdtemp(path.data()), 1);
     base::setTimeSource({{}, [](std::optional<base::Nanoseconds>) { set("press menu; quit"); }, {}});
     const int status = KVDMain();
-    rmdir(path.c_str());
+    std::filesystem::remove_all(path);
     return onLoop + std::to_string(status);
   });
   EXPECT_EQ(marks, "-++-0")
