@@ -12,6 +12,7 @@
 #include "platform/stage/report.h"
 #include "platform/stage/script_world.h"
 #include "platform/stage/spindle.h"
+#include "platform/stage/transcript.h"
 #include "remote/buttons.h"
 #include "remote/kvd_client.h"
 #include "remote/kvd_messages.h"

@@ -1,34 +1,37 @@
-// The director: reads commands, lets time pass and lets the daemon run, in a transcript or live at a
-// terminal.
+// The director: what both ways to play a rehearsal share. Commands are performed, time is let pass, the
+// daemon runs.
 #pragma once
 
 #include <functional>
-#include <iosfwd>
+#include <optional>
 #include <string>
 
+#include "platform/base/run_loop.h"
 #include "platform/stage/clock.h"
+#include "platform/stage/journal.h"
 
 namespace stage {
 
-/// Plays the commands of a descriptor in virtual time and writes the transcript: each command as it was read,
-/// and indented under it what came of it. Lines that begin with a blank are somebody's earlier transcript and
-/// are passed over. Runs the daemon from the first command that needs it. Returns the exit status: 1 when a
-/// command was unknown or wrong.
-int playTranscript(int input, std::ostream& output);
+// ---- For the ways to play ----
 
-/// Runs the daemon in real time and takes commands from the terminal on standard input, until the daemon
-/// ends. Returns the exit status.
-int playLive(std::ostream& output);
+/// Sets the run loop's time and where the journal goes.
+void beginRehearsal(base::TimeSource time, std::function<void(const JournalLine& line)> listener);
+/// Performs a command and journals what is wrong with it. False when something was.
+bool performCommand(const std::string& line);
+/// Runs the daemon to its end. Returns its exit status, which the journal tells too.
+int runDaemon();
+/// When the command in progress has let enough time pass; nothing when none does.
+std::optional<Nanoseconds> waitEnd();
+/// Ends that wait and does what was to be done then.
+void finishWait();
 
 // ---- For commands ----
 
 /// Lets so much time pass before the next command, and does something then.
 void waitThen(Nanoseconds duration, std::function<void()> then);
-/// Stops reading commands and answers other processes until the daemon ends.
-void serve();
 /// Whether the daemon has run and ended.
 bool daemonHasEnded();
-/// Writes a line under the command in progress.
+/// Answers the person at the desktop.
 void say(const std::string& text);
 
 }  // namespace stage

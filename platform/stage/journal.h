@@ -20,6 +20,8 @@ enum class Entry {
   Timer,         ///< a timer started or stopped
   Service,       ///< a setting of the window server or the service manager
   Exit,          ///< the daemon ended
+  Remark,        ///< what a command answers the person at the desktop
+  Error,         ///< what is wrong with a command
 };
 
 struct JournalLine {

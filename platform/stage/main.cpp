@@ -5,7 +5,8 @@
 #include <string_view>
 
 #include "platform/stage/desktop.h"
-#include "platform/stage/director.h"
+#include "platform/stage/live.h"
+#include "platform/stage/transcript.h"
 
 namespace {
 
@@ -39,5 +40,5 @@ int main(int argc, char** argv) {
   }
   stage::setUpDesktop();
   const bool live = isatty(STDIN_FILENO) != 0 && isatty(STDOUT_FILENO) != 0;
-  return live ? stage::playLive(std::cout) : stage::playTranscript(STDIN_FILENO, std::cout);
+  return live ? stage::playConsole(std::cout) : stage::playTranscript(STDIN_FILENO, std::cout);
 }

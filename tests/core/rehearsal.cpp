@@ -11,9 +11,9 @@
 
 #include "platform/stage/commands.h"
 #include "platform/stage/desktop.h"
-#include "platform/stage/director.h"
 #include "platform/stage/four_char_code.h"
 #include "platform/stage/journal.h"
+#include "platform/stage/transcript.h"
 
 namespace {
 
