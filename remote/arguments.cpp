@@ -27,7 +27,7 @@ std::chrono::milliseconds parseHold(std::string_view text) {
   const std::chrono::nanoseconds time = parseTime(text);
   const auto milliseconds = std::chrono::round<std::chrono::milliseconds>(time);
   if (milliseconds.count() < 1 || time > kLongestHold) {
-    throw UsageError("a button can be held for 1ms to 10m, not " + quoted(text));
+    throw UsageError("a button can be held for 1ms to 10m, not " + inQuotes(text));
   }
   return milliseconds;
 }
@@ -63,7 +63,7 @@ Line takeApart(std::span<const char* const> arguments) {
       setGesture(line, Gesture::Hold);
       line.hold = parseHold(word.substr(kHoldEquals.size()));
     } else {
-      throw UsageError("unknown option " + quoted(word));
+      throw UsageError("unknown option " + inQuotes(word));
     }
   }
   return line;
@@ -87,7 +87,7 @@ Arguments parseRaw(const Words& words) {
 
 Arguments parseButton(const Line& line) {
   const Button& button = knownButton(line.words[0]);
-  if (line.words.size() > 1) throw UsageError("one button at a time, without " + quoted(line.words[1]));
+  if (line.words.size() > 1) throw UsageError("one button at a time, without " + inQuotes(line.words[1]));
   Arguments arguments = withAction(Action::SendButton);
   arguments.usagePage = button.usagePage;
   arguments.usage = button.usage;
@@ -112,14 +112,14 @@ Arguments parseButton(const Line& line) {
 
 Arguments parseCommand(Action action, const Line& line) {
   const std::string_view command = line.words[0];
-  if (line.gesture) throw UsageError(quoted(command) + " is not a button");
+  if (line.gesture) throw UsageError(inQuotes(command) + " is not a button");
   Arguments arguments = withAction(action);
   if (action == Action::SetScreenLocked) {
     const std::string_view state = line.words.size() == 2 ? line.words[1] : "";
     if (state != "on" && state != "off") throw UsageError("lock takes 'on' or 'off'");
     arguments.locked = state == "on";
   } else if (line.words.size() > 1) {
-    throw UsageError(quoted(command) + " takes nothing after it");
+    throw UsageError(inQuotes(command) + " takes nothing after it");
   }
   return arguments;
 }

@@ -96,7 +96,7 @@ const Button& knownButton(std::string_view name) {
   std::string nearest;
   for (const std::string& near : nearestButtonNames(name)) nearest += (nearest.empty() ? "" : ", ") + near;
   throw UsageError(
-      "unknown button " + quoted(name) +
+      "unknown button " + inQuotes(name) +
       (nearest.empty() ? " ('kvremote list' shows them all)" : ", did you mean " + nearest + "?"));
 }
 

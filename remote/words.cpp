@@ -17,10 +17,12 @@ constexpr double kYear = 365.0 * 24 * 3600e9;
 
 }  // namespace
 
-std::string quoted(std::string_view word) { return "'" + std::string(word) + "'"; }
+std::string inQuotes(std::string_view word) { return "'" + std::string(word) + "'"; }
 
 std::chrono::nanoseconds parseTime(std::string_view text) {
-  const auto refuse = [&] { throw UsageError("not a time: " + quoted(text) + " (2s, 500ms, 1.5s, 2h10m)"); };
+  const auto refuse = [&] {
+    throw UsageError("not a time: " + inQuotes(text) + " (2s, 500ms, 1.5s, 2h10m)");
+  };
   double total = 0;
   std::string_view rest = text;
   do {
@@ -37,7 +39,7 @@ std::chrono::nanoseconds parseTime(std::string_view text) {
     total += number * (bare ? 1e9 : unit->nanoseconds);
     if (!bare) rest.remove_prefix(unit->name.size());
   } while (!rest.empty());
-  if (total > kYear) throw UsageError("a time is at most a year, not " + quoted(text));
+  if (total > kYear) throw UsageError("a time is at most a year, not " + inQuotes(text));
   return std::chrono::nanoseconds(std::llround(total));
 }
 

@@ -18,7 +18,7 @@ struct UsageError : std::runtime_error {
 };
 
 /// The word in single quotes.
-std::string quoted(std::string_view word);
+std::string inQuotes(std::string_view word);
 
 /// Reads a time such as 2s, 500ms, 1.5s, 1m, 2h or 2h10m; a bare number is seconds. At most a year. Throws
 /// UsageError.
@@ -39,7 +39,7 @@ Integer parseNumber(std::string_view what, std::string_view text) {
   const char* end = digits.data() + digits.size();
   const auto [rest, error] = std::from_chars(digits.data(), end, magnitude, hexadecimal ? 16 : 10);
   if (error == std::errc::invalid_argument || rest != end) {
-    throw UsageError("not a number for " + std::string(what) + ": " + quoted(text));
+    throw UsageError("not a number for " + std::string(what) + ": " + inQuotes(text));
   }
   constexpr std::int64_t kLeast = std::numeric_limits<Integer>::min();
   constexpr std::int64_t kMost = std::numeric_limits<Integer>::max();

@@ -22,7 +22,7 @@ namespace stage {
 
 namespace {
 
-using remote::quoted;
+using remote::inQuotes;
 using remote::UsageError;
 
 /// The words behind a command's name, and the whole text behind it.
@@ -95,7 +95,7 @@ void raw(const Words& words) {
 bool onOrOff(const std::string& word) {
   if (word == "on") return true;
   if (word == "off") return false;
-  throw UsageError("say on or off, not " + quoted(word));
+  throw UsageError("say on or off, not " + inQuotes(word));
 }
 
 void lock(const Words& words) { send(kvd_setscreenlocked, onOrOff(words.at(0)) ? 1 : 0); }
@@ -106,7 +106,7 @@ void quitDaemon(const Words&) { terminateDaemon(); }
 
 Application& installed(const std::string& name) {
   Application* const found = findApplication(name);
-  if (found == nullptr) throw UsageError("no application is called " + quoted(name));
+  if (found == nullptr) throw UsageError("no application is called " + inQuotes(name));
   return *found;
 }
 
@@ -118,10 +118,10 @@ Application& running(const std::string& name) {
 
 void open(const Words& words) {
   Application* const found = findOrInstallApplication(words.at(0));
-  if (found == nullptr) throw UsageError("no application is called " + quoted(words.at(0)));
+  if (found == nullptr) throw UsageError("no application is called " + inQuotes(words.at(0)));
   const bool again = words.size() > 1;
   if (again && words.at(1) != "again")
-    throw UsageError("only 'again' can follow, not " + quoted(words.at(1)));
+    throw UsageError("only 'again' can follow, not " + inQuotes(words.at(1)));
   if (found->running() && !again)
     throw UsageError(found->name + " runs already; 'again' starts it once more");
   openApplication(*found);
@@ -181,7 +181,7 @@ void setBroken(const std::string& name, bool broken) {
     }
   }
   throw UsageError("window-server, display-query, process-lookup or event-records can break, not " +
-                   quoted(name));
+                   inQuotes(name));
 }
 
 void breakPart(const Words& words) { setBroken(words.at(0), true); }
@@ -197,7 +197,7 @@ void answers(const Words& words) {
   } else if (words.at(1) == "errors") {
     application.manner = Manner::Refuses;
   } else {
-    throw UsageError("an application answers normally, nothing or errors, not " + quoted(words.at(1)));
+    throw UsageError("an application answers normally, nothing or errors, not " + inQuotes(words.at(1)));
   }
 }
 
@@ -208,7 +208,7 @@ void version(const Words& words) {
 
 void disc(const Words& words) {
   if (words.at(0) != "in" && words.at(0) != "out")
-    throw UsageError("a disc goes in or out, not " + quoted(words.at(0)));
+    throw UsageError("a disc goes in or out, not " + inQuotes(words.at(0)));
   for (const auto& application : desktop().installed) {
     if (auto* const player = dynamic_cast<Spindle*>(application.get())) player->setDisc(words.at(0) == "in");
   }
@@ -323,7 +323,7 @@ std::optional<std::string> runCommand(std::string_view line) {
   const std::string name = words.at(0);
   words.list.erase(words.list.begin());
   const Command* const command = findCommand(name);
-  if (command == nullptr) return "unknown command " + quoted(name);
+  if (command == nullptr) return "unknown command " + inQuotes(name);
   if (words.size() < command->fewest || words.size() > command->most) {
     return "usage: " + name + " " + std::string(command->arguments);
   }
