@@ -17,7 +17,7 @@ constexpr double kYear = 365.0 * 24 * 3600e9;
 
 }  // namespace
 
-std::string inQuotes(std::string_view word) { return "'" + std::string(word) + "'"; }
+std::string inQuotes(std::string_view word) { return std::string(1, '\'').append(word) + '\''; }
 
 std::chrono::nanoseconds parseTime(std::string_view text) {
   const auto refuse = [&] {

@@ -108,7 +108,7 @@ Owned<HostObject> PropertyListReader::readScalar(const Tag& tag) {
   if (tag.name == "data") {
     if (auto bytes = decodeBase64(text)) return Owned<HostObject>(new Data(std::move(*bytes)));
   }
-  xml_.fail("<" + std::string(tag.name) + "> is no value, or its content is malformed");
+  xml_.fail(std::string(tag.name) + " is no value, or its content is malformed");
 }
 
 }  // namespace

@@ -17,6 +17,6 @@ inline std::string fourCharacters(std::uint32_t code) {
 }
 
 /// The same in single quotes.
-inline std::string quoted(std::uint32_t code) { return "'" + fourCharacters(code) + "'"; }
+inline std::string quoted(std::uint32_t code) { return std::string(1, '\'') + fourCharacters(code) + '\''; }
 
 }  // namespace stage
