@@ -68,34 +68,17 @@ hold forward 2s
   +2s  script to Spindle: pause dvd
   +2s  Spindle: paused in chapter 3 at 0:36
 
-# And one from play ends in play.
 tap play
   asks who is in front: Spindle
   asks whether Lyrabox runs: yes
   script to Lyrabox: if player state is playing then ⏎ pause ⏎ end if
   script to Spindle: if dvd state is playing then ⏎ pause dvd ⏎ else ⏎ play dvd ⏎ end if
   Spindle: plays chapter 3 at 0:36
-hold rewind 1s
-  asks who is in front: Spindle
-  script to Spindle: get dvd menu active = false
-  script to Spindle: get dvd state = 'espl'
-  script to Spindle: set scanRate to dvd scan rate ⏎ set dvd scan rate to x8 ⏎ rewind dvd ⏎ set dvd scan rate to sca…
-  Spindle: scans back ×8 from chapter 3 at 0:36
-  +1s  asks who is in front: Spindle
-  +1s  script to Spindle: get dvd menu active = false
-  +1s  script to Spindle: play dvd
-  +1s  Spindle: plays chapter 3 at 0:28
 
-# Back and back again, past the first chapter into the menu.
-tap previous
-  asks who is in front: Spindle
-  script to Spindle: if chapter > 1 then ⏎ set chapter to chapter - 1 ⏎ else if elapsed time > 5 then ⏎ set chapter …
-  Spindle: goes to chapter 2
-wait 2s
-tap previous
-  asks who is in front: Spindle
-  script to Spindle: if chapter > 1 then ⏎ set chapter to chapter - 1 ⏎ else if elapsed time > 5 then ⏎ set chapter …
+# Back in the first chapter: to its beginning, and then to the menu.
+tell spindle to set chapter to 1
   Spindle: goes to chapter 1
+  = 1
 wait 8s
 tap previous
   asks who is in front: Spindle

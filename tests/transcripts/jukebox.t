@@ -17,12 +17,6 @@ tap next
   asks who is in front: Lyrabox
   script to Lyrabox: next track
   Lyrabox: plays "Paper Boats"
-wait 2s
-tap left
-  asks who is in front: Lyrabox
-  script to Lyrabox: back track
-  Lyrabox: plays "Harbour Lights"
-wait 10s
 tap menu-left
   asks who is in front: Lyrabox
   script to Lyrabox: back track
@@ -58,11 +52,11 @@ raw 0x0C 0xB2 1
 wait 20m
   +3m34s  Lyrabox: plays "Paper Boats"
   +6m41s  Lyrabox: plays "Slow Train North"
-  +9m27s  asks who is in front: Lyrabox ×2
+  +9m39s  asks who is in front: Lyrabox ×2
   +10m46s  Lyrabox: plays "Lantern Street"
   +14m7s  Lyrabox: plays "Last Ferry"
   +17m59s  Lyrabox: stopped
-  +19m27s  asks who is in front: Lyrabox ×2
+  +19m39s  asks who is in front: Lyrabox ×2
 show
   Lyrabox (in front): stopped
   output volume 50

@@ -37,51 +37,29 @@ hold down 1.5s
 
 # If the menu goes away in the middle, the held button turns into volume down: kvd unmutes the player and posts
 # the sound key, marked as repeated, at the same pace and without an end of its own.
-tap app-menu
-  asks who is in front: Spindle
-  script to Spindle: get dvd menu active = true
-  script to Spindle: go return to dvd
-  Spindle: plays chapter 1 at 0:00
-tap app-menu
-  asks who is in front: Spindle
-  script to Spindle: get dvd menu active = false
-  script to Spindle: get dvd state = 'espl'
-  script to Spindle: go to main menu
-  Spindle: shows the disc menu, at "Play the film"
+volume 5
+  output volume 50 → 5
 press down
   asks whether Spindle runs: yes
   asks who is in front: Spindle
   script to Spindle: get dvd menu active = true
   script to Spindle: press down arrow key
-  Spindle: menu at "Chapter 4"
   timer of 0.01s starts
 wait 1.1s
-  +1.05s  asks whether Spindle runs: yes
-  +1.05s  script to Spindle: get dvd menu active = true
-  +1.05s  script to Spindle: press down arrow key
-  +1.05s  Spindle: menu at "Subtitles"
-  +1.06s to +1.1s  ×5:
+  +1.05s to +1.1s  ×6:
     asks whether Spindle runs: yes
     script to Spindle: get dvd menu active = true
     script to Spindle: press down arrow key
-volume 10
-  output volume 50 → 10
 tell spindle to play dvd
   Spindle: plays chapter 1 at 0:00
 wait 1m
   +0.01s  asks whether Spindle runs: yes
   +0.01s  script to Spindle: get dvd menu active = false
   +0.01s  script to Spindle: set audio muted to false = false
-  +0.01s  script: output volume of (get volume settings) = 10
+  +0.01s  script: output volume of (get volume settings) = 5
   +0.01s  sound key down pressed, repeated
-  +0.01s  output volume 10 → 5
-  +0.02s  asks whether Spindle runs: yes
-  +0.02s  script to Spindle: get dvd menu active = false
-  +0.02s  script to Spindle: set audio muted to false = false
-  +0.02s  script: output volume of (get volume settings) = 5
-  +0.02s  sound key down pressed, repeated
-  +0.02s  output volume 5 → 0
-  +0.03s to +1m  ×5998:
+  +0.01s  output volume 5 → 0
+  +0.02s to +1m  ×5999:
     asks whether Spindle runs: yes
     script to Spindle: get dvd menu active = false
     script to Spindle: set audio muted to false = false

@@ -21,42 +21,6 @@ tap right
   script to Snapvale: slideshow running = false
   script to Snapvale: set theAlbums to the id of every album ⏎ set albumIndex to -1 ⏎ repeat with i from 1 to count the…
   Snapvale: album "Faces"
-tap right
-  asks who is in front: Snapvale
-  finds Snapvale running
-  script to Snapvale: slideshow running = false
-  script to Snapvale: set theAlbums to the id of every album ⏎ set albumIndex to -1 ⏎ repeat with i from 1 to count the…
-  Snapvale: album "Places"
-tap right
-  asks who is in front: Snapvale
-  finds Snapvale running
-  script to Snapvale: slideshow running = false
-  script to Snapvale: set theAlbums to the id of every album ⏎ set albumIndex to -1 ⏎ repeat with i from 1 to count the…
-  Snapvale: album "Last Import"
-tap right
-  asks who is in front: Snapvale
-  finds Snapvale running
-  script to Snapvale: slideshow running = false
-  script to Snapvale: set theAlbums to the id of every album ⏎ set albumIndex to -1 ⏎ repeat with i from 1 to count the…
-  Snapvale: album "Harbour"
-tap left
-  asks who is in front: Snapvale
-  finds Snapvale running
-  script to Snapvale: slideshow running = false
-  script to Snapvale: set theAlbums to the id of every album ⏎ set albumIndex to 0 ⏎ repeat with i from 1 to count theA…
-  Snapvale: album "Last Import"
-tap left
-  asks who is in front: Snapvale
-  finds Snapvale running
-  script to Snapvale: slideshow running = false
-  script to Snapvale: set theAlbums to the id of every album ⏎ set albumIndex to 0 ⏎ repeat with i from 1 to count theA…
-  Snapvale: album "Places"
-tap left
-  asks who is in front: Snapvale
-  finds Snapvale running
-  script to Snapvale: slideshow running = false
-  script to Snapvale: set theAlbums to the id of every album ⏎ set albumIndex to 0 ⏎ repeat with i from 1 to count theA…
-  Snapvale: album "Faces"
 tap left
   asks who is in front: Snapvale
   finds Snapvale running
@@ -71,11 +35,6 @@ tap left
   key 48 to Snapvale
   key 126 to Snapvale
   Snapvale: album "Events"
-
-# Back from the fourth album goes by keys: Tab into the list of albums, one up.
-show
-  Snapvale (in front): album "Events"
-  output volume 50
 
 # A show, paused and stepped by keys; the menu button ends it.
 tap play
@@ -113,4 +72,4 @@ tap menu
   notification com.tarn.kvd.terminated of com.tarn.kvd
   timer of 10m stops
   exit status 0
-  left alive: string ×45, list ×15, serial number ×16, source ×1, port ×1, event source ×1
+  left alive: string ×27, list ×9, serial number ×10, source ×1, port ×1, event source ×1

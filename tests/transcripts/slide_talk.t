@@ -17,71 +17,45 @@ tap play
   Slidewell takes the display
   Slidewell: slide 1 of 12
 
-# Play and next both show the next slide; play-pause freezes and unfreezes.
+# Play shows the next slide now; play-pause freezes.
 tap play
   asks who is in front: Slidewell
   script to Slidewell: get slide switcher visible = false
   script to Slidewell: get playing = true
   script to Slidewell: show next slide
   Slidewell: slide 2 of 12
-tap next
-  asks who is in front: Slidewell
-  script to Slidewell: get slide switcher visible = false
-  script to Slidewell: get playing = true
-  script to Slidewell: show next slide
-  Slidewell: slide 3 of 12
 tap playpause
   asks who is in front: Slidewell
   script to Slidewell: get slide switcher visible = false
   script to Slidewell: get playing = true
   script to Slidewell: if frozen then ⏎ set frozen to false ⏎ else ⏎ set frozen to true ⏎ end if
-  Slidewell: slide 3 of 12, frozen
-tap playpause
-  asks who is in front: Slidewell
-  script to Slidewell: get slide switcher visible = false
-  script to Slidewell: get playing = true
-  script to Slidewell: if frozen then ⏎ set frozen to false ⏎ else ⏎ set frozen to true ⏎ end if
-  Slidewell: slide 3 of 12
+  Slidewell: slide 2 of 12, frozen
 
-# A question about slide 5: the switcher finds it.
+# A question about slide 3: the switcher finds it.
 tap app-menu
   asks who is in front: Slidewell
   script to Slidewell: get slide switcher visible = false
   script to Slidewell: get playing = true
   script to Slidewell: show slide switcher
-  Slidewell: slide 3 of 12, switcher at 3
+  Slidewell: slide 2 of 12, switcher at 2
 tap right
   asks who is in front: Slidewell
   script to Slidewell: get slide switcher visible = true
   script to Slidewell: move slide switcher forward
-  Slidewell: slide 3 of 12, switcher at 4
-tap right
-  asks who is in front: Slidewell
-  script to Slidewell: get slide switcher visible = true
-  script to Slidewell: move slide switcher forward
-  Slidewell: slide 3 of 12, switcher at 5
+  Slidewell: slide 2 of 12, switcher at 3
 tap pick
   asks who is in front: Slidewell
   script to Slidewell: get slide switcher visible = true
   script to Slidewell: accept slide switcher
-  Slidewell: slide 5 of 12
+  Slidewell: slide 3 of 12, frozen
 
-# Forward goes to the last slide, rewind to the first; their releases do nothing.
+# Forward goes to the last slide; its release does nothing.
 tap forward
   asks who is in front: Slidewell
   script to Slidewell: get slide switcher visible = false
   script to Slidewell: get playing = true
   script to Slidewell: show last slide of first slideshow
-  Slidewell: slide 12 of 12
-  asks who is in front: Slidewell
-  script to Slidewell: get slide switcher visible = false
-  script to Slidewell: get playing = true
-tap rewind
-  asks who is in front: Slidewell
-  script to Slidewell: get slide switcher visible = false
-  script to Slidewell: get playing = true
-  script to Slidewell: show first slide of first slideshow
-  Slidewell: slide 1 of 12
+  Slidewell: slide 12 of 12, frozen
   asks who is in front: Slidewell
   script to Slidewell: get slide switcher visible = false
   script to Slidewell: get playing = true
@@ -104,10 +78,6 @@ tap menu
   script to Slidewell: stop slideshow
   Slidewell gives the display back
   Slidewell: shows no slides
-tap menu
-  asks who is in front: Slidewell
-  script to Slidewell: get slide switcher visible = false
-  script to Slidewell: get playing = false
   end of input
   notification com.tarn.kvd.terminated of com.tarn.kvd
   timer of 10m stops

@@ -58,18 +58,6 @@ tap right
   finds Lumbra running
   finds Spindle running
   asks who is in front: Lumbra
-mend process-lookup
-break display-query
-tap down
-  asks whether Spindle runs: yes
-  asks who is in front: Lumbra
-  asks whether Lumbra runs: yes
-  key 125 pressed in Lumbra
-  Lumbra: photo in row 2, column 1
-  +0.05s  key 125 released in Lumbra
-  +0.06s  asks whether Spindle runs: yes
-  +0.06s  asks who is in front: Lumbra
-  +0.06s  asks whether Lumbra runs: yes
 break event-records
 front nobody
 tap volume-up

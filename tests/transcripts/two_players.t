@@ -24,7 +24,7 @@ tap play
   VistremePlayerX: shows its remote display
   VistremePlayerX: plays "Dune Walk"
 
-# A scan climbs: 2, 4, 8 and round again. Play-pause goes back to what was before.
+# A scan climbs: 2, then 4. Play-pause goes back to what was before.
 tap forward
   asks who is in front: VistremePlayerX
   script to VistremePlayerX: get rate of front document = 1
@@ -42,27 +42,11 @@ tap forward
   VistremePlayerX: plays "Dune Walk" at rate 4
   asks who is in front: VistremePlayerX
   script to VistremePlayerX: get rate of front document = 4
-tap forward
-  asks who is in front: VistremePlayerX
-  script to VistremePlayerX: get rate of front document = 4
-  script to VistremePlayerX: set maxRate to 8.0 ⏎ set scanRate to rate of front document ⏎ tell front document to show remote …
-  VistremePlayerX: shows its remote display
-  VistremePlayerX: plays "Dune Walk" at rate 8
-  asks who is in front: VistremePlayerX
-  script to VistremePlayerX: get rate of front document = 8
-tap forward
-  asks who is in front: VistremePlayerX
-  script to VistremePlayerX: get rate of front document = 8
-  script to VistremePlayerX: set maxRate to 8.0 ⏎ set scanRate to rate of front document ⏎ tell front document to show remote …
-  VistremePlayerX: shows its remote display
-  VistremePlayerX: plays "Dune Walk" at rate 2
-  asks who is in front: VistremePlayerX
-  script to VistremePlayerX: get rate of front document = 2
 tap playpause
   asks who is in front: VistremePlayerX
   asks whether Lyrabox runs: yes
   script to Lyrabox: if player state is playing then ⏎ pause ⏎ end if
-  script to VistremePlayerX: get rate of front document = 2
+  script to VistremePlayerX: get rate of front document = 4
   script to VistremePlayerX: tell front document to show remote hud ⏎ play front document
   VistremePlayerX: shows its remote display
   VistremePlayerX: plays "Dune Walk"

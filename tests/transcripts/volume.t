@@ -3,9 +3,9 @@ open lyrabox
   Lyrabox starts
 front lyrabox
   Lyrabox comes to the front
-volume 85
-  output volume 50 → 85
-hold volume-up 1.3s
+volume 90
+  output volume 50 → 90
+hold volume-up 1.2s
   connects to the window server
   finds Lyrabox running
   holds the user's own input back for 0 s after a synthetic event
@@ -13,25 +13,22 @@ hold volume-up 1.3s
   timer of 10m starts
   notification com.tarn.kvd.started of com.tarn.kvd
   asks who is in front: Lyrabox ×2
-  script: output volume of (get volume settings) = 85
+  script: output volume of (get volume settings) = 90
   sound key up pressed
-  output volume 85 → 90
+  output volume 90 → 95
   timer of 0.1s starts
-  +1.05s  script: output volume of (get volume settings) = 90
+  +1.05s  script: output volume of (get volume settings) = 95
   +1.05s  sound key up pressed, repeated
-  +1.05s  output volume 90 → 95
-  +1.15s  script: output volume of (get volume settings) = 95
-  +1.15s  sound key up pressed, repeated
-  +1.15s  output volume 95 → 100
-  +1.25s  script: output volume of (get volume settings) = 100
-  +1.25s  script: output muted of (get volume settings) = false
-  +1.25s  sound key up pressed
-  +1.25s  asks who is in front: Lyrabox
-  +1.25s  script to Lyrabox: set sound volume to sound volume + 2
-  +1.25s  Lyrabox: volume 60 → 62
-  +1.3s  timer of 0.1s stops
-  +1.3s  script: output volume of (get volume settings) = 100
-  +1.3s  sound key up released
+  +1.05s  output volume 95 → 100
+  +1.15s  script: output volume of (get volume settings) = 100
+  +1.15s  script: output muted of (get volume settings) = false
+  +1.15s  sound key up pressed
+  +1.15s  asks who is in front: Lyrabox
+  +1.15s  script to Lyrabox: set sound volume to sound volume + 2
+  +1.15s  Lyrabox: volume 60 → 62
+  +1.2s  timer of 0.1s stops
+  +1.2s  script: output volume of (get volume settings) = 100
+  +1.2s  sound key up released
 
 # And beyond: at the top the output is unmuted and the player's own volume goes up, a step at a time.
 mute on
@@ -63,7 +60,7 @@ hold volume-up 1.2s
 # Down is plainer: it looks at neither the level nor the mute.
 mute on
   output muted
-hold down 1.2s
+hold down 1.1s
   script: output volume of (get volume settings) = 100
   sound key down pressed
   output volume 100 → 95
@@ -71,54 +68,24 @@ hold down 1.2s
   +1.05s  script: output volume of (get volume settings) = 95
   +1.05s  sound key down pressed, repeated
   +1.05s  output volume 95 → 90
-  +1.15s  script: output volume of (get volume settings) = 90
-  +1.15s  sound key down pressed, repeated
-  +1.15s  output volume 90 → 85
-  +1.2s  timer of 0.1s stops
-  +1.2s  script: output volume of (get volume settings) = 85
-  +1.2s  sound key down released
+  +1.1s  timer of 0.1s stops
+  +1.1s  script: output volume of (get volume settings) = 90
+  +1.1s  sound key down released
 
 # A button that nobody lets go stops by itself: ten seconds after the press.
-volume 50
-  output volume 85 → 50
+volume 5
+  output volume 90 → 5
 press volume-down
-  script: output volume of (get volume settings) = 50
+  script: output volume of (get volume settings) = 5
   sound key down pressed
-  output volume 50 → 45
+  output volume 5 → 0
   timer of 0.1s starts
 wait 1h
-  +1.05s  script: output volume of (get volume settings) = 45
-  +1.05s  sound key down pressed, repeated
-  +1.05s  output volume 45 → 40
-  +1.15s  script: output volume of (get volume settings) = 40
-  +1.15s  sound key down pressed, repeated
-  +1.15s  output volume 40 → 35
-  +1.25s  script: output volume of (get volume settings) = 35
-  +1.25s  sound key down pressed, repeated
-  +1.25s  output volume 35 → 30
-  +1.35s  script: output volume of (get volume settings) = 30
-  +1.35s  sound key down pressed, repeated
-  +1.35s  output volume 30 → 25
-  +1.45s  script: output volume of (get volume settings) = 25
-  +1.45s  sound key down pressed, repeated
-  +1.45s  output volume 25 → 20
-  +1.55s  script: output volume of (get volume settings) = 20
-  +1.55s  sound key down pressed, repeated
-  +1.55s  output volume 20 → 15
-  +1.65s  script: output volume of (get volume settings) = 15
-  +1.65s  sound key down pressed, repeated
-  +1.65s  output volume 15 → 10
-  +1.75s  script: output volume of (get volume settings) = 10
-  +1.75s  sound key down pressed, repeated
-  +1.75s  output volume 10 → 5
-  +1.85s  script: output volume of (get volume settings) = 5
-  +1.85s  sound key down pressed, repeated
-  +1.85s  output volume 5 → 0
-  +1.95s to +9.95s  ×81:
+  +1.05s to +9.95s  ×90:
     script: output volume of (get volume settings) = 0
     sound key down pressed, repeated
   +10.05s  timer of 0.1s stops
-  +9m56.3s to +59m56.3s  asks who is in front: Lyrabox ×12
+  +9m56.5s to +59m56.5s  asks who is in front: Lyrabox ×12
   end of input
   notification com.tarn.kvd.terminated of com.tarn.kvd
   timer of 10m stops
