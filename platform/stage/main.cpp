@@ -2,8 +2,10 @@
 
 #include <cstdio>
 #include <iostream>
+#include <optional>
 #include <string_view>
 
+#include "platform/screen/screen.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/live.h"
 #include "platform/stage/transcript.h"
@@ -15,12 +17,25 @@ constexpr char kHelp[] =
     "\n"
     "Runs kvd on the rehearsal desktop: model applications in memory, a real service port.\n"
     "\n"
-    "With a terminal it runs in real time and takes commands; other processes reach it with kvremote.\n"
+    "With a terminal it runs in real time and shows the desktop; other processes reach it with kvremote.\n"
     "Without one it reads commands from standard input and writes a transcript in virtual time. Lines\n"
     "that begin with a blank are passed over, so that a transcript can be played again.\n"
     "The command 'help' lists the commands.\n"
     "\n"
-    "Exit status: 0, 1 when a command was unknown or wrong, 2 for a bad command line.\n";
+    "Exit status: 0, 1 when kvd could not start or a command of a transcript was unknown or wrong, 2 for a\n"
+    "bad command line.\n";
+
+/// On a full screen where the terminal can show one, else line by line.
+int playAtTerminal() {
+  const std::optional<int> shown = live::play();
+  const int status = shown ? *shown : stage::playConsole(std::cout);
+  if (status != 0) {
+    std::fputs("kvd-stage: kvd could not start; does another one run?\n", stderr);
+  } else if (shown) {
+    std::puts("kvd has ended.");
+  }
+  return status;
+}
 
 }  // namespace
 
@@ -39,6 +54,6 @@ int main(int argc, char** argv) {
     return 2;
   }
   stage::setUpDesktop();
-  const bool live = isatty(STDIN_FILENO) != 0 && isatty(STDOUT_FILENO) != 0;
-  return live ? stage::playConsole(std::cout) : stage::playTranscript(STDIN_FILENO, std::cout);
+  const bool atTerminal = isatty(STDIN_FILENO) != 0 && isatty(STDOUT_FILENO) != 0;
+  return atTerminal ? playAtTerminal() : stage::playTranscript(STDIN_FILENO, std::cout);
 }

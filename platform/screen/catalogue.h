@@ -1,0 +1,18 @@
+// The applications as a person chooses among them.
+#pragma once
+
+#include <string_view>
+#include <vector>
+
+#include "platform/stage/desktop.h"
+
+namespace live {
+
+/// Those that can be opened, in the order of the digits that stand for them. What is always there without
+/// having been opened, a helper, is not among them.
+std::vector<const stage::Application*> openable(const stage::Desktop& desktop);
+
+/// What it is, for somebody who meets its name for the first time: "disc player". Empty when nobody knows.
+std::string_view roleOf(const stage::Application& application);
+
+}  // namespace live

@@ -1,0 +1,65 @@
+// What the journal's part of the screen shows: lines in the order in which they came, repeats folded.
+#pragma once
+
+#include <cstddef>
+#include <deque>
+#include <string>
+#include <vector>
+
+#include "platform/stage/journal.h"
+
+namespace live {
+
+/// What a line is, for its colour.
+enum class Tone {
+  Command,   ///< what the person did
+  Answer,    ///< what a command answered
+  Error,     ///< what went wrong
+  Question,  ///< what the daemon asked
+  Action,    ///< what it sent: a script, an event, a key
+  Change,    ///< what came of it
+  Service,   ///< its dealings with the system
+};
+
+struct Line {
+  Tone tone;
+  std::wstring text;
+  bool operator==(const Line&) const = default;
+};
+
+class JournalView {
+ public:
+  void add(const stage::JournalLine& line);
+  /// What the person did. Nothing is folded across it.
+  void addCommand(const std::string& command);
+
+  /// At most `rows` rows of the view at a width, top to bottom, the newest last; without the last `back`
+  /// rows. `back` is held so that the view stays full as long as there is enough to show.
+  std::vector<Line> show(int rows, int columns, int& back) const;
+
+ private:
+  struct Row {
+    Line line;
+    std::size_t count;
+    bool operator==(const Row&) const = default;
+  };
+  /// One row, or some that came `count` times one after the other.
+  struct Block {
+    std::vector<Row> rows;
+    std::size_t count = 1;
+  };
+
+  bool isRow(std::size_t fromEnd) const;
+  const Row& row(std::size_t fromEnd) const {
+    return (blocks_.end() - static_cast<std::ptrdiff_t>(fromEnd))->rows[0];
+  }
+  bool foldRow();
+  bool foldIntoBlock(std::size_t length);
+  bool foldIntoNewBlock(std::size_t length);
+  void push(Line line);
+  static std::vector<Line> render(const Block& block, int columns);
+
+  std::deque<Block> blocks_;
+};
+
+}  // namespace live

@@ -1,0 +1,88 @@
+#include "platform/screen/screen.h"
+
+#include <unistd.h>
+
+#include <limits>
+#include <memory>
+
+#include "platform/base/run_loop.h"
+#include "platform/screen/controls.h"
+#include "platform/screen/paint.h"
+#include "platform/screen/state.h"
+#include "platform/screen/terminal.h"
+#include "platform/stage/desktop.h"
+#include "platform/stage/live.h"
+
+namespace live {
+
+namespace {
+
+using base::Source;
+
+/// A source that is on the run loop as long as it lives.
+class OnLoop {
+ public:
+  explicit OnLoop(Source* source) : source_(source) {
+    HostRunLoopAddSource(HostRunLoopCurrent(), source_, HostRunLoopMode::Default);
+  }
+  ~OnLoop() {
+    HostRunLoopRemoveSource(HostRunLoopCurrent(), source_, HostRunLoopMode::Default);
+    HostRelease(source_);
+  }
+  OnLoop(const OnLoop&) = delete;
+  OnLoop& operator=(const OnLoop&) = delete;
+
+ private:
+  const HostSourceRef source_;
+};
+
+void endRun() { HostRunLoopStop(HostRunLoopCurrent()); }
+
+/// A size or a stop comes before anything else.
+constexpr std::int32_t kSignalsOrder = std::numeric_limits<std::int32_t>::min();
+
+/// Takes one key, so that what it sends is done before the next. False when there was none.
+bool takeKey(Terminal& terminal, State& state) {
+  const std::optional<Keypress> key = terminal.read();
+  if (key) handle(state, *key);
+  return key.has_value();
+}
+
+void draw(State& state) {
+  state.lessons.observe(stage::desktop());
+  paint(state, stage::desktop());
+}
+
+}  // namespace
+
+std::optional<int> play() {
+  const std::unique_ptr<Terminal> terminal = Terminal::open();
+  if (terminal == nullptr) return std::nullopt;
+  preparePaint();
+  State state;
+  const OnLoop signals(new Source(terminal->signals(), kSignalsOrder, [&] {
+    if (!terminal->obeySignals()) endRun();
+  }));
+  bool tookKey = false;
+  return stage::playLive({
+      .show = [&](const stage::JournalLine& line) { state.journal.add(line); },
+      .input =
+          [&] {
+            if (!takeKey(*terminal, state) && terminal->hungUp()) endRun();
+          },
+      .idle =
+          [&] {
+            // Of an Escape that began no key the rest was read already, which the descriptor does not tell.
+            tookKey = takeKey(*terminal, state);
+            draw(state);
+          },
+      .wakeUp = [&]() -> std::optional<stage::Nanoseconds> {
+        if (tookKey) return stage::now();
+        // What plays moves its position.
+        if (stage::nextDesktopChange()) return stage::now() + stage::kSecond;
+        return std::nullopt;
+      },
+  });
+}
+
+}  // namespace live
