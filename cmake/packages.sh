@@ -29,6 +29,7 @@ is_installed() {
       pkg-config --exists gtest 2>/dev/null || [[ -e /usr/include/gtest/gtest.h ]] ||
         [[ -e /usr/local/include/gtest/gtest.h ]]
       ;;
+    libncurses-dev) [[ -e /usr/include/ncurses.h || -e /usr/include/curses.h ]] ;;
     *) command -v "$package" >/dev/null ;;
   esac
 }

@@ -154,8 +154,8 @@ void tell(const Words& words) {
 }
 
 void volume(const Words& words) {
-  const int wanted = remote::parseNumber<std::uint8_t>("an output volume", words.at(0));
-  if (wanted > 100) throw UsageError("an output volume is 0 to 100, not " + words.at(0));
+  const int wanted = remote::parseNumber<std::int32_t>("an output volume", words.at(0));
+  if (wanted < 0 || wanted > 100) throw UsageError("an output volume is 0 to 100, not " + words.at(0));
   setOutputVolume(wanted);
 }
 
