@@ -9,6 +9,8 @@
 #include <sstream>
 #include <utility>
 
+#include "platform/base/run_loop.h"
+#include "platform/stage/clock.h"
 #include "platform/stage/commands.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/four_char_code.h"
@@ -22,8 +24,11 @@ std::string sSent;
 
 void listen(const stage::JournalLine& line) {
   sJournal += line.text + "\n";
-  if (line.kind != stage::Entry::Script && line.kind != stage::Entry::Event) return;
-  sSent += (line.kind == stage::Entry::Script ? line.source : line.text) + "; ";
+  const bool script = line.kind == stage::Entry::Script;
+  // The keystroke helper's keys go to somebody; the daemon's are pressed in some process.
+  const bool key = line.kind == stage::Entry::Key && line.text.find(" in ") != std::string::npos;
+  if (!script && !key && line.kind != stage::Entry::Event && line.kind != stage::Entry::SoundKey) return;
+  sSent += (script ? line.source : line.text) + "; ";
 }
 
 std::string readAll(int descriptor) {
@@ -52,6 +57,7 @@ std::string inChild(const std::function<std::string()>& play) {
   if (child == 0) {
     close(ends[0]);
     stage::useVirtualTime();
+    base::setTimeSource({stage::now, {}, stage::pass});
     stage::setUpDesktop();
     stage::setJournalListener(listen);
     writeAll(ends[1], play());
@@ -82,7 +88,10 @@ void set(const std::string& commands) {
   for (std::size_t start = 0; start < commands.size();) {
     const std::size_t end = std::min(commands.find("; ", start), commands.size());
     const auto error = stage::runCommand(commands.substr(start, end - start));
-    if (error) sJournal += "error: " + *error + "\n";
+    if (error) {
+      std::fprintf(stderr, "%s: %s\n", commands.c_str(), error->c_str());
+      std::abort();
+    }
     start = end + 2;
   }
 }

@@ -16,14 +16,15 @@ std::string inChild(const std::function<std::string()>& play);
 /// The transcript of these commands, one a line.
 std::string transcriptOf(const std::string& commands);
 
-/// Performs commands of the desktop, separated by "; ", without a daemon; for use inside a child.
+/// Performs commands of the desktop, separated by "; ", without a daemon, and ends the child where one
+/// is refused; for use inside a child.
 void set(const std::string& commands);
 
 /// The journal's lines since the last call, each ended by a line break; for use inside a child.
 std::string journal();
 
-/// The scripts and events that went out since the last call, each with "; " behind it, a script without its
-/// address; for use inside a child.
+/// What went out since the last call, scripts in full, events, keys and sound keys, each with "; " behind it;
+/// for use inside a child.
 std::string sent();
 
 /// A four-character code as text.
