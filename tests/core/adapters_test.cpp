@@ -113,14 +113,26 @@ void expectModes(const Adapter& adapter, const std::vector<std::string>& setUps,
     }
   }
   EXPECT_EQ(expected.size(), count);
+  // What sends nothing changes nothing either and needs no child of its own.
+  std::vector<std::string> quiet;
+  std::string quietly;
+  std::map<std::string, std::string> loud;
   for (const auto& [button, key] : kButtons) {
     const Row row = expected.contains(button) ? expected[button] : Row{button, "-"};
-    for (const std::string& setUp : setUps) {
-      SCOPED_TRACE(adapter.code + " " + setUp + ": " + button);
-      EXPECT_EQ(played(adapter, setUp, {button + " 1"}), queries + row.pressed + "; ");
-      EXPECT_EQ(played(adapter, setUp, {button + " 0"}), queries + row.released + "; ");
-      EXPECT_EQ(played(adapter, setUp, {button + " -1"}), queries + row.negative + "; ");
+    for (const auto& [value, text] :
+         {std::pair(" 1", row.pressed), std::pair(" 0", row.released), std::pair(" -1", row.negative)}) {
+      if (text.size() > 1) {
+        loud[button + value] = queries + text + "; ";
+      } else {
+        quiet.push_back(button + value);
+        quietly += queries + text + "; ";
+      }
     }
+  }
+  for (const std::string& setUp : setUps) {
+    SCOPED_TRACE(adapter.code + " " + setUp);
+    EXPECT_EQ(played(adapter, setUp, quiet), quietly);
+    for (const auto& [step, result] : loud) EXPECT_EQ(played(adapter, setUp, {step}), result) << step;
   }
 }
 

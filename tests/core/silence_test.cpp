@@ -57,7 +57,8 @@ TEST(Silence, ReachesEveryOtherThatRuns) {
                     sent();
                     SilenceAllBut(code);
                     const std::string actual = named(sent());
-                    if (actual != expected) wrong += text(code) + ", " + state + ": " + actual + "\n";
+                    if (actual != expected)
+                      wrong.append(text(code)).append(", " + state + ": ").append(actual);
                   }
                 }
                 return wrong;

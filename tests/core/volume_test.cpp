@@ -118,9 +118,10 @@ TEST(Repeat, OfAVolumeButtonEndsAfterTenSecondsOrAtTheNextEvent) {
   EXPECT_EQ(rehearsed("open lyrabox\nfront lyrabox\nvolume 0", "raw 0x01 0x8D 7 0xFFFE\nwait 15s\nlock on\n"
                       "press volume-down\nwait 1.2s\nrelease menu\nwait 5s"),
             "raw 0x01 0x8D 7 0xFFFE | " + press + "wait 15s | +1.05s to +9.95s  ×90: | "
-            "repeats ea000c by 7 | " + repeat + "+10.05s  timer of 0.1s stops | lock on | press volume-down | " + press +
-            "wait 1.2s | +1.05s to +1.15s  ×2: | repeats ea000c by 1, locked | " + repeat +
-            "release menu | timer of 0.1s stops | asks who is in front: Lyrabox | wait 5s");
+            "repeats ea000c by 7 | " + repeat + "+10.05s  timer of 0.1s stops | "
+            "lock on | press volume-down | " + press +
+            "wait 1.2s | +1.05s to +1.15s  ×2: | repeats ea000c by 1, locked | " + repeat + "release menu | "
+            "timer of 0.1s stops | asks who is in front: Lyrabox | wait 5s");
 }
 
 TEST(Repeat, OfAMenuStepHasNoLimitAndFollowsTheMenu) {
