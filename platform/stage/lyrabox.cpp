@@ -31,8 +31,6 @@ constexpr Nanoseconds kRestartThreshold = 3 * kSecond;
 constexpr std::uint32_t kHookClass = words::code("hook");
 constexpr std::uint32_t kRemoteSelectEvent = words::code("RSel");
 
-double inSeconds(Nanoseconds time) { return static_cast<double>(time) / static_cast<double>(kSecond); }
-
 }  // namespace
 
 Lyrabox::Lyrabox() : Application("com.tarn.Lyrabox", "Lyrabox", "4.2") {}

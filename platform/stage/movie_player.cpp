@@ -17,8 +17,6 @@ using tarnscript::Value;
 
 constexpr Nanoseconds kFrame = kSecond / 25;
 
-double inSeconds(Nanoseconds time) { return static_cast<double>(time) / static_cast<double>(kSecond); }
-
 std::string numberText(double number) {
   char text[32];
   std::snprintf(text, sizeof text, "%g", number);

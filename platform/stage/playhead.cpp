@@ -28,6 +28,10 @@ std::optional<Nanoseconds> Playhead::arrival(Nanoseconds length) const {
   return since_ + static_cast<Nanoseconds>(std::ceil(static_cast<double>(left) / std::abs(rate_)));
 }
 
+double inSeconds(Nanoseconds position) {
+  return static_cast<double>(position) / static_cast<double>(kSecond);
+}
+
 std::string positionText(Nanoseconds position) {
   const Nanoseconds seconds = position / kSecond;
   const std::string rest = std::to_string(seconds % 60);

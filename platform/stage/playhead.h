@@ -33,6 +33,9 @@ class Playhead {
   double rate_ = 0;
 };
 
+/// A position as scripts speak of it.
+double inSeconds(Nanoseconds position);
+
 /// A position for people: minutes and seconds, "3:05".
 std::string positionText(Nanoseconds position);
 
