@@ -12,6 +12,7 @@ struct RunLoop final : HostObject {
   RunLoop() : HostObject(kKind) { immortal = true; }
   bool running = false;
   bool stopped = false;
+  std::uint64_t passes = 0;
 };
 
 RunLoop& theLoop() {
@@ -32,7 +33,8 @@ bool fireDueTimers(const RunLoop& loop) {
 }
 
 /// True when there was something to do.
-bool runPass(const RunLoop& loop) {
+bool runPass(RunLoop& loop) {
+  ++loop.passes;
   const bool fired = fireDueTimers(loop);
   const auto source = retained(nextReadySource());
   if (source == nullptr || loop.stopped) return fired;
@@ -51,6 +53,9 @@ void run(RunLoop& loop) {
 }
 
 }  // namespace
+
+std::uint64_t turn() { return theLoop().passes; }
+
 }  // namespace base
 
 HostRunLoopRef HostRunLoopCurrent() { return HostRunLoopRef(&base::theLoop()); }

@@ -79,6 +79,9 @@ struct Timer final : HostObject {
   bool invalidated = false;
 };
 
+/// A number that is another one in every pass of the loop.
+std::uint64_t turn();
+
 /// Told of every timer that goes on the loop (true) and leaves it (false).
 void setTimerObserver(std::function<void(const Timer& timer, bool started)> observer);
 

@@ -1,0 +1,53 @@
+// The programs that run and play a role: owners of MPRIS2 names and clients of the X server, merged.
+//
+// What the bus knows and what the X server knows of one program meet by its process; where a sandbox's proxy
+// hides that, by its desktop entry.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "platform/host.h"
+#include "platform/linux/mpris.h"
+#include "platform/linux/roles.h"
+#include "platform/linux/xserver.h"
+
+namespace desktop {
+
+/// One running program that plays a role.
+struct Instance {
+  Role role = Role::None;
+  /// Null for a program that is not in the table: it was cast by its desktop entry.
+  const Program* program = nullptr;
+  /// Its desktop entry without ".desktop"; empty where it is unknown.
+  std::string entry;
+  pid_t process = 0;
+  /// The high word tells processes apart that had the same number; the low word is the process id.
+  HostProcessSerialNumber serialNumber;
+  /// Its player on the bus, by unique name; empty when it has none.
+  std::string owner;
+  /// Its windows, topmost first.
+  std::vector<Window> windows;
+};
+
+/// Takes in what the bus and the X server have sent, and brings the list up to date.
+void takeInDesktop();
+
+/// Changes whenever the list does.
+std::uint32_t applicationListSeed();
+
+/// In the order that a person expects of several instances of a role: the one in front, then one that plays,
+/// then the one that was started last.
+const std::vector<Instance>& instances();
+
+/// The first instance of a role as they stand now; null when none runs. Valid until takeInDesktop.
+const Instance* firstInstance(Role role);
+/// Valid until takeInDesktop.
+const Instance* findInstance(const HostProcessSerialNumber& serialNumber);
+/// The instance whose window is the active one; null when no program with a role is in front.
+const Instance* frontInstance();
+
+/// The player of an instance; null when it has none on the bus or has just left it.
+Player* playerOf(const Instance& instance);
+
+}  // namespace desktop
