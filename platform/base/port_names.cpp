@@ -25,6 +25,7 @@ bool isServicePort(mach_port_t name) {
 }  // namespace
 
 MakeRoom makeRoom = nullptr;
+BootstrapTest bootstrapIsThere = nullptr;
 
 mach_port_t portName(std::string_view service) {
   const auto known = std::ranges::find(ports, service, &ServicePort::service);
@@ -60,6 +61,7 @@ kern_return_t task_get_special_port(mach_port_t task, int which, mach_port_t* po
   if (task != base::kTaskPort || which != TASK_BOOTSTRAP_PORT || port == nullptr) {
     return KERN_INVALID_ARGUMENT;
   }
+  if (base::bootstrapIsThere != nullptr && !base::bootstrapIsThere()) return KERN_FAILURE;
   *port = base::kBootstrapPort;
   return KERN_SUCCESS;
 }

@@ -29,4 +29,8 @@ int sendSocket(mach_port_t name);
 using MakeRoom = bool (*)(mach_port_t name);
 extern MakeRoom makeRoom;
 
+/// Whether there is a bootstrap server to ask for; set by a host on whose desktop it can be missing.
+using BootstrapTest = bool (*)();
+extern BootstrapTest bootstrapIsThere;
+
 }  // namespace base

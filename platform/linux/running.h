@@ -22,7 +22,8 @@ struct Instance {
   /// Its desktop entry without ".desktop"; empty where it is unknown.
   std::string entry;
   pid_t process = 0;
-  /// The high word tells processes apart that had the same number; the low word is the process id.
+  /// The high word is when the process started, which tells apart those that had the same number; the low
+  /// word is the process id.
   HostProcessSerialNumber serialNumber;
   /// Its player on the bus, by unique name; empty when it has none.
   std::string owner;
@@ -36,18 +37,23 @@ void takeInDesktop();
 /// Changes whenever the list does.
 std::uint32_t applicationListSeed();
 
-/// In the order that a person expects of several instances of a role: the one in front, then one that plays,
-/// then the one that was started last.
+/// In no particular order. Valid until takeInDesktop, as all that follow.
 const std::vector<Instance>& instances();
 
-/// The first instance of a role as they stand now; null when none runs. Valid until takeInDesktop.
+/// The instances of a role in the order that a person expects: the one in front, then those that play, then
+/// the others, each group with the one that was started last at its head.
+std::vector<const Instance*> instancesOf(Role role);
+/// The first of them; null when none runs.
 const Instance* firstInstance(Role role);
-/// Valid until takeInDesktop.
+/// Null when it has gone.
 const Instance* findInstance(const HostProcessSerialNumber& serialNumber);
 /// The instance whose window is the active one; null when no program with a role is in front.
 const Instance* frontInstance();
 
 /// The player of an instance; null when it has none on the bus or has just left it.
 Player* playerOf(const Instance& instance);
+
+/// Asks the window manager, or the player where it has no window, to bring a program to the front.
+void bringToFront(const Instance& instance);
 
 }  // namespace desktop

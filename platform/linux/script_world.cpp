@@ -1,0 +1,57 @@
+#include "platform/linux/script_world.h"
+
+#include <strings.h>
+
+#include <string>
+
+#include "platform/linux/additions.h"
+#include "platform/linux/role_application.h"
+#include "platform/scripting/script.h"
+
+namespace desktop {
+
+namespace {
+
+struct Row {
+  const char* identifier;
+  const char* name;
+  tarnscript::Application& (*application)();
+};
+
+constexpr Row kApplications[] = {
+    {"com.tarn.Lyrabox", "Lyrabox", jukebox},
+    {"com.tarn.Spindle", "Spindle", discPlayer},
+    {"com.tarn.vistremeplayer", "VistremePlayer", classicMovies},
+    {"com.tarn.VistremePlayerX", "VistremePlayerX", modernMovies},
+    {"com.tarn.Officra.Slidewell", "Slidewell", presentation},
+    {"com.tarn.Snapvale", "Snapvale", photoLibrary},
+    {"com.tarn.Keyhouse", "Keyhouse", keyhouse},
+};
+
+class World final : public tarnscript::World {
+ public:
+  tarnscript::Application* find(std::string_view identifierOrName) override;
+  tarnscript::Application& additions() override { return desktop::additions(); }
+};
+
+tarnscript::Application* World::find(std::string_view identifierOrName) {
+  const std::string wanted(identifierOrName);
+  for (const Row& row : kApplications) {
+    if (wanted == row.identifier || wanted == row.name) return &row.application();
+  }
+  for (const Row& row : kApplications) {
+    if (strcasecmp(wanted.c_str(), row.identifier) == 0 || strcasecmp(wanted.c_str(), row.name) == 0) {
+      return &row.application();
+    }
+  }
+  return nullptr;
+}
+
+}  // namespace
+
+void letScriptsFindRoles() {
+  static World world;
+  scripting::setHooks({&world, nullptr, nullptr});
+}
+
+}  // namespace desktop
