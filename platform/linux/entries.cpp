@@ -3,7 +3,6 @@
 #include <fcntl.h>
 #include <gio/gdesktopappinfo.h>
 #include <poll.h>
-#include <strings.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -15,6 +14,8 @@
 #include <functional>
 #include <memory>
 #include <optional>
+
+#include "platform/tarnscript/text.h"
 
 namespace desktop {
 
@@ -216,10 +217,6 @@ std::vector<std::int64_t> directoryTimes() {
   return times;
 }
 
-bool equalIgnoringCase(const std::string& a, std::string_view b) {
-  return a.size() == b.size() && strncasecmp(a.data(), b.data(), a.size()) == 0;
-}
-
 template <typename Test>
 const Entry* find(Test test) {
   const auto& all = entries();
@@ -243,13 +240,13 @@ const std::vector<Entry>& entries() {
 
 const Entry* entryByID(std::string_view id) {
   if (id.empty()) return nullptr;
-  return find([&](const Entry& entry) { return equalIgnoringCase(entry.id, id); });
+  return find([&](const Entry& entry) { return tarnscript::equalIgnoringCase(entry.id, id); });
 }
 
 const Entry* entryByWindowClass(std::string_view windowClass) {
   if (windowClass.empty()) return nullptr;
   const Entry* const found =
-      find([&](const Entry& entry) { return equalIgnoringCase(entry.windowClass, windowClass); });
+      find([&](const Entry& entry) { return tarnscript::equalIgnoringCase(entry.windowClass, windowClass); });
   return found != nullptr ? found : entryByID(windowClass);
 }
 

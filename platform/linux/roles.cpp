@@ -1,9 +1,8 @@
 #include "platform/linux/roles.h"
 
-#include <strings.h>
-
 #include <algorithm>
-#include <string>
+
+#include "platform/tarnscript/text.h"
 
 namespace desktop {
 
@@ -87,14 +86,10 @@ constexpr std::string_view kBystanders[] = {
     "kdeconnect",
 };
 
-bool equalIgnoringCase(std::string_view a, std::string_view b) {
-  return a.size() == b.size() && strncasecmp(a.data(), b.data(), a.size()) == 0;
-}
-
 const Program* programBy(const char* Program::*name, std::string_view value) {
   if (value.empty()) return nullptr;
   const auto* const found = std::find_if(std::begin(kPrograms), std::end(kPrograms), [&](const Program& row) {
-    return equalIgnoringCase(row.*name, value);
+    return tarnscript::equalIgnoringCase(row.*name, value);
   });
   return found != std::end(kPrograms) ? found : nullptr;
 }

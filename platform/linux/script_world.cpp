@@ -1,12 +1,9 @@
 #include "platform/linux/script_world.h"
 
-#include <strings.h>
-
-#include <string>
-
 #include "platform/linux/additions.h"
 #include "platform/linux/role_application.h"
 #include "platform/scripting/script.h"
+#include "platform/tarnscript/text.h"
 
 namespace desktop {
 
@@ -35,12 +32,12 @@ class World final : public tarnscript::World {
 };
 
 tarnscript::Application* World::find(std::string_view identifierOrName) {
-  const std::string wanted(identifierOrName);
   for (const Row& row : kApplications) {
-    if (wanted == row.identifier || wanted == row.name) return &row.application();
+    if (identifierOrName == row.identifier || identifierOrName == row.name) return &row.application();
   }
   for (const Row& row : kApplications) {
-    if (strcasecmp(wanted.c_str(), row.identifier) == 0 || strcasecmp(wanted.c_str(), row.name) == 0) {
+    if (tarnscript::equalIgnoringCase(identifierOrName, row.identifier) ||
+        tarnscript::equalIgnoringCase(identifierOrName, row.name)) {
       return &row.application();
     }
   }
