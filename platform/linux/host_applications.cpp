@@ -48,10 +48,10 @@ bool matches(const Instance& instance, std::size_t count, const HostStringRef* k
   return true;
 }
 
+/// As the list stands: a button asks about every program several times, and has asked for the seed before.
 const Instance* instanceOf(HostSessionID session, HostSerialNumberRef serialNumber) {
   const auto* const number = base::as<base::SerialNumber>(serialNumber);
   if (session != kHostDefaultSession || number == nullptr) return nullptr;
-  desktop::takeInDesktop();
   return desktop::findInstance(number->process);
 }
 
