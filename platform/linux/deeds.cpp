@@ -1,11 +1,5 @@
 #include "platform/linux/deeds.h"
 
-#include <cstring>
-
-#include "platform/linux/gtk_actions.h"
-#include "platform/linux/keysyms.h"
-#include "platform/linux/mpv_channel.h"
-#include "platform/linux/vlc_channel.h"
 #include "platform/scripting/lyrabox_dictionary.h"
 #include "platform/scripting/movie_dictionaries.h"
 #include "platform/scripting/slidewell_dictionary.h"
