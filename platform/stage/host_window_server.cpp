@@ -1,9 +1,9 @@
 // The window server's side of the host interface: sound keys, keys for one process, displays.
 
 #include <algorithm>
-#include <cstring>
 #include <string>
 
+#include "platform/base/event_record.h"
 #include "platform/base/values.h"
 #include "platform/host.h"
 #include "platform/stage/desktop.h"
@@ -16,18 +16,6 @@ using stage::Entry;
 using stage::record;
 
 constexpr HostConnectionID kConnection = 1;
-
-// The event record, by byte offsets.
-constexpr std::uint32_t kRecordLength = 240;
-constexpr std::size_t kLengthOffset = 4;
-constexpr std::size_t kTypeOffset = 8;
-constexpr std::size_t kSubtypeOffset = 138;
-constexpr std::size_t kDataOffset = 140;
-
-constexpr std::uint32_t kSystemDefined = 14;
-constexpr std::uint16_t kAuxiliaryControlButton = 8;
-constexpr std::uint32_t kSoundDownKey = 1;
-constexpr std::uint32_t kKeyDown = 0x0A;
 
 /// What one sound key adds to the output volume.
 constexpr int kVolumeStep = 5;
@@ -44,22 +32,11 @@ struct KeyEvent final : HostObject {
   const bool down;
 };
 
-template <typename T>
-T fieldAt(const void* data, std::size_t offset) {
-  T value;
-  std::memcpy(&value, static_cast<const std::byte*>(data) + offset, sizeof value);
-  return value;
-}
-
-void pressSoundKey(std::uint32_t data) {
-  const std::uint32_t key = data >> 16;
-  const bool down = (data >> 8 & 0xFF) == kKeyDown;
-  const bool repeated = (data & 1) != 0;
-  if (key > kSoundDownKey) return;
-  record(Entry::SoundKey, std::string("sound key ") + (key == kSoundDownKey ? "down" : "up") +
-                              (down ? " pressed" : " released") + (repeated ? ", repeated" : ""));
-  if (!down) return;
-  stage::setOutputVolume(stage::desktop().outputVolume + (key == kSoundDownKey ? -kVolumeStep : kVolumeStep));
+void pressSoundKey(const base::SoundKey& key) {
+  record(Entry::SoundKey, std::string("sound key ") + (key.louder ? "up" : "down") +
+                              (key.pressed ? " pressed" : " released") + (key.repeated ? ", repeated" : ""));
+  if (!key.pressed) return;
+  stage::setOutputVolume(stage::desktop().outputVolume + (key.louder ? kVolumeStep : -kVolumeStep));
 }
 
 }  // namespace
@@ -78,20 +55,14 @@ std::int32_t HostSetLocalEventsSuppressionInterval(HostConnectionID connection, 
 }
 
 std::int32_t HostClearEventRecord(void* eventRecord, std::uint32_t length) {
-  if (eventRecord == nullptr || length < kLengthOffset + sizeof length) return -1;
-  std::memset(eventRecord, 0, length);
-  std::memcpy(static_cast<std::byte*>(eventRecord) + kLengthOffset, &length, sizeof length);
-  return 0;
+  return base::clearEventRecord(eventRecord, length) ? 0 : -1;
 }
 
 std::int32_t HostPostEventRecord(HostConnectionID connection, const void* eventRecord, std::uint32_t length,
                                  std::int32_t) {
-  if (connection != kConnection || eventRecord == nullptr || length != kRecordLength) return -1;
+  if (connection != kConnection || eventRecord == nullptr || !base::isEventRecordLength(length)) return -1;
   if (stage::desktop().broken.eventRecords) return -1;
-  if (fieldAt<std::uint32_t>(eventRecord, kTypeOffset) == kSystemDefined &&
-      fieldAt<std::uint16_t>(eventRecord, kSubtypeOffset) == kAuxiliaryControlButton) {
-    pressSoundKey(fieldAt<std::uint32_t>(eventRecord, kDataOffset));
-  }
+  if (const auto key = base::soundKeyIn(eventRecord)) pressSoundKey(*key);
   return 0;
 }
 
