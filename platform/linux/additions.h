@@ -1,0 +1,11 @@
+// The commands of no application in particular: the output volume.
+#pragma once
+
+#include "platform/tarnscript/tarnscript.h"
+
+namespace desktop {
+
+/// "get volume settings" and "set volume" on the default sink. Borrowed; lives as long as the process.
+tarnscript::Application& additions();
+
+}  // namespace desktop

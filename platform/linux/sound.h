@@ -1,0 +1,28 @@
+// The volume of the default output, through libpulse, which speaks to PulseAudio and to PipeWire alike.
+//
+// The server is asked when there is a question and tells nothing by itself: other programs' sound never wakes
+// kvd, and whatever sink is the default one is found anew each time. The connection is made when it is first
+// needed and made again, at most once a turn of the run loop, after it was lost.
+#pragma once
+
+#include <optional>
+
+namespace desktop {
+
+struct SoundState {
+  /// The loudest channel, in percent as volume sliders show it, 0 to 100. What is amplified reads as 100.
+  int volume = 0;
+  bool muted = false;
+};
+
+/// The default sink's; nothing without a server, without a sink, or when no answer comes in time.
+std::optional<SoundState> soundState();
+
+/// Sets the loudest channel of the default sink in percent, held within 0 and 100; the other channels keep
+/// their proportion to it. False where soundState would be nothing.
+bool setOutputVolume(int percent);
+
+/// Mutes or unmutes the default sink. False where soundState would be nothing.
+bool setOutputMuted(bool muted);
+
+}  // namespace desktop
