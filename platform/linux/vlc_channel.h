@@ -19,4 +19,17 @@ bool hasVlcChannel(pid_t process);
 /// Carries out a command line ("key key-nav-up"). Throws tarnscript::Refusal where nobody takes it.
 void vlcCommand(pid_t process, std::string_view line);
 
+/// One of so many: titles count from 1 and chapters from 0.
+struct VlcPlace {
+  int number = 0;
+  int count = 0;
+};
+
+/// The title that plays: 0 of several while a disc shows a menu; 0 of 1 or none for a plain file. While VLC
+/// is paused it does not tell: then as it told last. Nothing when it never has.
+std::optional<VlcPlace> vlcTitle(pid_t process);
+
+/// The chapter that plays, told as the title is.
+std::optional<VlcPlace> vlcChapter(pid_t process);
+
 }  // namespace desktop

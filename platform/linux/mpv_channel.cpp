@@ -1,0 +1,58 @@
+#include "platform/linux/mpv_channel.h"
+
+#include <algorithm>
+#include <nlohmann/json.hpp>
+
+#include "platform/linux/channel.h"
+#include "platform/tarnscript/tarnscript.h"
+
+namespace desktop {
+
+namespace {
+
+using Json = nlohmann::json;
+
+constexpr std::string_view kExecutable = "mpv";
+
+/// On a connection of its own every request may have the same number.
+constexpr int kRequest = 1;
+
+constexpr int kTextMilliseconds = 2000;
+
+/// Sends a command, a list of words and numbers, and waits until mpv has carried it out. False where it
+/// cannot.
+bool request(pid_t process, Json command, Microseconds limit) {
+  Channel channel(process, kExecutable, limit);
+  const Json message = {{"command", std::move(command)}, {"request_id", kRequest}};
+  if (!channel.isOpen() ||
+      !channel.write(message.dump(-1, ' ', false, Json::error_handler_t::replace) + "\n")) {
+    return false;
+  }
+  while (const auto line = channel.readLine()) {
+    const Json answer = Json::parse(*line, nullptr, false);
+    // Events come on the same connection, and have no such number.
+    if (!answer.is_object() || !answer.contains("request_id") || answer["request_id"] != kRequest) continue;
+    return answer.contains("error") && answer["error"] == "success";
+  }
+  return false;
+}
+
+}  // namespace
+
+bool hasMpvChannel(pid_t process) { return !channelPath(process, kExecutable).empty(); }
+
+void mpvCommand(pid_t process, std::string_view command) {
+  Json words = Json::array();
+  while (!command.empty()) {
+    const std::size_t length = std::min(command.find(' '), command.size());
+    if (length > 0) words.push_back(std::string(command.substr(0, length)));
+    command.remove_prefix(std::min(length + 1, command.size()));
+  }
+  if (!request(process, std::move(words), kCommandLimit)) throw tarnscript::Refusal{"mpv cannot do that"};
+}
+
+bool showMpvText(pid_t process, std::string_view text) {
+  return request(process, Json::array({"show-text", std::string(text), kTextMilliseconds}), kQueryLimit);
+}
+
+}  // namespace desktop
