@@ -135,8 +135,12 @@ Value Jukebox::perform(const tarnscript::Event& event) {
       scan(player(), -kScanRate);
       break;
     case words::kBackTrack:
+      endFastPlaying(player());
       backTrack();
       break;
+    case words::kNextTrack:
+      endFastPlaying(player());
+      return RoleApplication::perform(event);
     default:
       return RoleApplication::perform(event);
   }
