@@ -51,6 +51,9 @@ constexpr Deed kDeeds[] = {
     {Role::DiscPlayer, kOthers, spindle::kActiveMenu, Means::Code, "main menu while a menu shows"},
     {Role::DiscPlayer, kOthers, spindle::kHasMedia, Means::Code, "whether something plays, is paused or stands in the play list"},
     {Role::DiscPlayer, kOthers, spindle::kAudioVolume, Means::Code, "Volume; 0 to 255"},
+    {Role::DiscPlayer, kOthers, spindle::kAudioMuted, Means::Code, "fails: no way to ask for it or to change it"},
+    {Role::DiscPlayer, kOthers, spindle::kDisplayingSubtitle, Means::Code, "fails: no way to ask for it"},
+    {Role::DiscPlayer, kOthers, spindle::kControllerVisibility, Means::Code, "fails: players hide their controls by themselves"},
     {Role::DiscPlayer, kOthers, spindle::kViewerFullScreen, Means::Code, "Fullscreen"},
     {Role::DiscPlayer, kOthers, spindle::kPlayDVD, Means::Code, "plays at the normal rate; other disc players that play pause"},
     {Role::DiscPlayer, kOthers, spindle::kPauseDVD, Means::Code, "pauses and ends a scan"},
@@ -78,7 +81,6 @@ constexpr Deed kDeeds[] = {
     {Role::DiscPlayer, kOthers, spindle::kPressEnter, Means::Key, "Return"},
 
     // The classic movie player.
-    {Role::ClassicMovies, kOthers, movies::kDocument, Means::Code, "the film of the first instance; none while it has none"},
     {Role::ClassicMovies, kOthers, movies::kName, Means::Code, "its title"},
     {Role::ClassicMovies, kOthers, movies::kRate, Means::Code, "0 pauses, 1 plays; others by Rate where the player has it, else by seeking four times a second"},
     {Role::ClassicMovies, kOthers, movies::kPlaying, Means::Code, "whether it plays or is scanned"},
@@ -98,7 +100,6 @@ constexpr Deed kDeeds[] = {
     {Role::ClassicMovies, kOthers, movies::kClose, Means::Mpris, "Stop"},
 
     // The modern movie player.
-    {Role::ModernMovies, kOthers, movies::kDocument, Means::Code, "the film of the first instance; none while it has none"},
     {Role::ModernMovies, kOthers, movies::kName, Means::Code, "its title"},
     {Role::ModernMovies, kOthers, movies::kRate, Means::Code, "0 pauses, 1 plays; others by Rate where the player has it, else by seeking four times a second"},
     {Role::ModernMovies, kOthers, movies::kPlaying, Means::Code, "whether it plays or is scanned"},
