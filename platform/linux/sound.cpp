@@ -7,7 +7,6 @@
 
 #include <algorithm>
 #include <cstdint>
-#include <cstdlib>
 #include <functional>
 #include <memory>
 #include <string>
@@ -45,29 +44,6 @@ Nanoseconds deadlineIn(Microseconds limit) {
 
 // ---- The connection
 
-/// libpulse opens $DISPLAY to look for the address of a server elsewhere, and waits for the X server without
-/// limit. Servers elsewhere are named in $PULSE_SERVER or client.conf.
-class WithoutDisplay {
- public:
-  WithoutDisplay() {
-    if (const char* display = std::getenv("DISPLAY")) display_ = display;
-    unsetenv("DISPLAY");
-  }
-  ~WithoutDisplay() {
-    if (display_) setenv("DISPLAY", display_->c_str(), 1);
-  }
-  WithoutDisplay(const WithoutDisplay&) = delete;
-  WithoutDisplay& operator=(const WithoutDisplay&) = delete;
-
- private:
-  std::optional<std::string> display_;
-};
-
-Context newContext() {
-  const WithoutDisplay noDisplay;
-  return Context(pa_context_new(&pulseLoop(), "kvd"));
-}
-
 bool isGood(const pa_context* context) {
   return context != nullptr && PA_CONTEXT_IS_GOOD(pa_context_get_state(context));
 }
@@ -83,7 +59,7 @@ pa_context* connection(Nanoseconds deadline) {
   if (sTried == base::turn()) return nullptr;
   sTried = base::turn();
 
-  Context context = newContext();
+  Context context(pa_context_new(&pulseLoop(), "kvd"));
   if (context == nullptr || pa_context_connect(context.get(), nullptr, PA_CONTEXT_NOAUTOSPAWN, nullptr) < 0) {
     return nullptr;
   }
