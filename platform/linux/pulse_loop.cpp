@@ -48,9 +48,10 @@ constexpr Nanoseconds kMicrosecond = 1'000;
 template <typename Event>
 using Events = std::vector<std::unique_ptr<Event>>;
 
-Events<pa_io_event> sDescriptors;
-Events<pa_time_event> sTimes;
-Events<pa_defer_event> sDeferred;
+// Kept to the end of the process: a context that goes at exit still frees its events.
+auto& sDescriptors = *new Events<pa_io_event>;
+auto& sTimes = *new Events<pa_time_event>;
+auto& sDeferred = *new Events<pa_defer_event>;
 
 base::Owned<base::Timer> sTimer;
 /// When that timer is due.
