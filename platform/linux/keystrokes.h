@@ -10,8 +10,9 @@ namespace desktop {
 /// full-screen one, else the topmost. 0 when it has none.
 Window keyboardWindow(const Instance& instance);
 
-/// Presses and releases one key, given as parseKey reads it, in that window. False when the text is no key,
-/// the keyboard has no such key or the program has no window.
-bool type(const Instance& instance, std::string_view key);
+/// Presses and releases keys in that window, one after another: texts as parseKey reads them, one blank
+/// apart. False when the first of them is no key, or one that the keyboard has not, or the program has no
+/// window.
+bool type(const Instance& instance, std::string_view keys);
 
 }  // namespace desktop

@@ -25,13 +25,15 @@ struct Client {
   std::string className;
   /// _GTK_APPLICATION_ID; empty where the program has none.
   std::string applicationID;
+  /// It belongs to another window (WM_TRANSIENT_FOR).
+  bool isDialog = false;
 };
 
-/// Whether there is an X server with a window manager that can be asked.
+/// Whether there is an X server.
 bool hasXServer();
 
-/// Takes in what the X server has sent. True when windows came or went, or changed whose they are, since the
-/// last call.
+/// Takes in what the X server has sent. True when windows came or went, or changed their order or whose they
+/// are, since the last call.
 bool takeInX();
 
 /// The managed windows, topmost first.
