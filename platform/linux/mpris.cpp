@@ -66,7 +66,7 @@ void readMetadata(sd_bus_message* message, PlayerState& state) {
 
 void readProperty(sd_bus_message* message, std::string_view key, std::string_view type, PlayerState& state) {
   if (key == mpris::kPlaybackStatus) {
-    state.status = mpris::statusNamed(readText(message, type).value_or("")).value_or(PlaybackStatus::Stopped);
+    state.told = mpris::statusNamed(readText(message, type).value_or("")).value_or(PlaybackStatus::Stopped);
   } else if (key == "Rate") {
     state.rate = held(readNumber(message, type), -kFastestRate, kFastestRate, 1);
   } else if (key == "MinimumRate") {
@@ -102,11 +102,20 @@ void setProperty(Player& player, const char* interface, const char* property, co
           value);
 }
 
+void believe(Player& player, PlaybackStatus status) {
+  player.status.reset();
+  player.wish = Wish{status, HostAbsoluteTime() + kSettling};
+}
+
+std::optional<PlaybackStatus> believed(const Player& player) {
+  if (!player.wish || HostAbsoluteTime() >= player.wish->until) return std::nullopt;
+  return player.wish->status;
+}
+
 /// Play and Pause toggle in some players, and Play starts the track over in others: only a player whose
 /// status differs is told.
 void bringTo(Player& player, PlaybackStatus wanted, const char* member) {
-  player.status.reset();
-  player.wish = Wish{wanted, HostAbsoluteTime() + kSettling};
+  believe(player, wanted);
   try {
     command(player, {mpris::kPath, mpris::kPlayerInterface, member}, "");
   } catch (const tarnscript::Refusal&) {
@@ -129,14 +138,13 @@ PlayerState stateOf(Player& player) {
   readDictionary(answer.get(), [&](std::string_view key, std::string_view type) {
     readProperty(answer.get(), key, type, state);
   });
-  if (player.wish && HostAbsoluteTime() < player.wish->until) state.status = player.wish->status;
+  state.status = believed(player).value_or(state.told);
   return state;
 }
 
 PlaybackStatus statusOf(Player& player) {
   if (player.status) return *player.status;
-  if (player.wish && HostAbsoluteTime() < player.wish->until) return player.wish->status;
-  player.wish.reset();
+  if (const auto status = believed(player)) return *status;
   // Every player has this property.
   const Message answer = ask(player, "Get", mpris::kPlayerInterface, mpris::kPlaybackStatus);
   const char* text = nullptr;
@@ -192,6 +200,7 @@ void seekTo(Player& player, std::int64_t position) { seekTo(player, stateOf(play
 
 void seekTo(Player& player, const PlayerState& state, std::int64_t position) {
   position = std::max<std::int64_t>(position, 0);
+  believe(player, state.status);
   if (state.trackID.empty()) {
     command(player, {mpris::kPath, mpris::kPlayerInterface, "Seek"}, "x", position - state.position);
   } else {

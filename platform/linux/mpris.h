@@ -17,8 +17,8 @@ namespace desktop {
 
 enum class PlaybackStatus : std::uint8_t { Playing, Paused, Stopped };
 
-/// What a command has asked for: believed for a moment, as many players answer the command first and do it
-/// then.
+/// The status that a command leads to: believed for a moment, as many players answer the command first and do
+/// it then, and some say that they are paused while they seek.
 struct Wish {
   PlaybackStatus status;
   /// On the clock of HostAbsoluteTime.
@@ -58,7 +58,10 @@ std::list<Player>& players();
 
 /// Everything a player tells of itself at one moment. Times in microseconds, volume 1.0 is its full one.
 struct PlayerState {
+  /// As statusOf answers.
   PlaybackStatus status = PlaybackStatus::Stopped;
+  /// As the player says at that moment, which it may take back.
+  PlaybackStatus told = PlaybackStatus::Stopped;
   double rate = 1;
   double volume = 1;
   double minimumRate = 1;

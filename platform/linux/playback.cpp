@@ -9,6 +9,9 @@ namespace desktop {
 
 namespace {
 
+/// From here on a rate is a scan's, which somebody else may have begun, and not one at which people watch.
+constexpr double kSlowestScan = 2;
+
 /// Only one plays at a time, in one role too.
 void pauseOthers(const Instance& chosen) {
   for (const Instance* other : instancesOf(chosen.role)) {
@@ -61,7 +64,7 @@ void playAtRate(const Instance& instance, double rate) {
     return scan(player, rate);
   }
   endScan(player);
-  if (rate != 1 && !player.ownRate) player.ownRate = state.rate;
+  if (rate != 1 && !player.ownRate) player.ownRate = state.rate < kSlowestScan ? state.rate : 1;
   setRate(player, rate);
   play(player);
 }

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cmath>
 #include <list>
+#include <utility>
 
 #include "platform/host.h"
 #include "platform/tarnscript/tarnscript.h"
@@ -24,8 +25,10 @@ constexpr double kFastest = 1000;
 struct Scan {
   std::string owner;
   double rate;
-  /// What the player did when the scan began. Whoever changes that ends the scan.
+  /// What the player did when the scan began. Whoever changes that ends the scan; that it does something
+  /// else for one step may come from the seek.
   PlaybackStatus status;
+  bool strayed;
   /// What is scanned, and where in it the scan stands. Players that seek to the nearest key frame or answer
   /// with an old position do not hold it up.
   std::string trackID;
@@ -61,7 +64,8 @@ bool step(Scan& scan) {
   Player* const player = playerOf(scan);
   if (player == nullptr) return false;
   const PlayerState state = stateOf(*player);
-  if (state.status != scan.status) return false;
+  const bool strayedBefore = std::exchange(scan.strayed, state.told != scan.status);
+  if (scan.strayed && strayedBefore) return false;
   if (state.trackID != scan.trackID || state.url != scan.url) {
     scan.trackID = state.trackID;
     scan.url = state.url;
@@ -107,7 +111,7 @@ void scan(Player& player, double rate) {
   const HostTimerRef timer = HostCreateRepeatingTimer(now + kInterval, kInterval, tick, nullptr);
   if (!timer) throw tarnscript::Refusal{"there is no timer"};
   sScans.push_back(
-      {player.callee.name, rate, state.status, state.trackID, state.url, state.position, now, timer});
+      {player.callee.name, rate, state.status, false, state.trackID, state.url, state.position, now, timer});
   HostRunLoopAddTimer(HostRunLoopCurrent(), timer, HostRunLoopMode::Default);
 }
 
