@@ -1,5 +1,6 @@
 #include "platform/linux/deeds.h"
 
+#include "platform/linux/own_words.h"
 #include "platform/scripting/lyrabox_dictionary.h"
 #include "platform/scripting/movie_dictionaries.h"
 #include "platform/scripting/slidewell_dictionary.h"
@@ -115,10 +116,62 @@ constexpr Deed kDeeds[] = {
     {Role::ModernMovies, kOthers, movies::kShowRemoteHUD, Means::Code, "a desktop notification with title and time, which takes the place of the one before"},
 
     // Presentations.
+    {Role::Presentation, "org.gnome.Evince", slidewell::kStart, Means::Action, "win.presentation"},
+    {Role::Presentation, "org.kde.okular", slidewell::kStart, Means::Code, "`slotTogglePresentation` of Okular's own interface on the bus"},
+    {Role::Presentation, "org.kde.okular", slidewell::kStart, Means::Key, "Control+Shift+p"},
+    {Role::Presentation, kOthers, slidewell::kStart, Means::Key, "F5"},
+    {Role::Presentation, kOthers, slidewell::kStop, Means::Key, "Escape"},
+    {Role::Presentation, kOthers, slidewell::kShow, Means::Code, "the first slide: key Home; the last: key End; others fail"},
+    {Role::Presentation, kOthers, slidewell::kShowNext, Means::Key, "Right"},
+    {Role::Presentation, kOthers, slidewell::kShowPrevious, Means::Key, "Left"},
+    {Role::Presentation, kOthers, slidewell::kShowSwitcher, Means::Code, "fails: no program has one"},
+    {Role::Presentation, kOthers, slidewell::kAcceptSwitcher, Means::Code, "fails"},
+    {Role::Presentation, kOthers, slidewell::kCancelSwitcher, Means::Code, "fails"},
+    {Role::Presentation, kOthers, slidewell::kSwitcherForward, Means::Code, "fails"},
+    {Role::Presentation, kOthers, slidewell::kSwitcherBackward, Means::Code, "fails"},
+    {Role::Presentation, "libreoffice-impress", slidewell::kPlaying, Means::Code, "whether a full-screen window stands beside the document's"},
+    {Role::Presentation, "org.kde.okular", slidewell::kPlaying, Means::Code, "whether a full-screen window stands beside the document's"},
+    {Role::Presentation, kOthers, slidewell::kPlaying, Means::Code, "whether a window is full screen, and not by the action `win.fullscreen`"},
+    {Role::Presentation, kOthers, slidewell::kFrozen, Means::Code, "key b, which takes the picture away; remembered until a step, a jump or the end of the show"},
+    {Role::Presentation, kOthers, slidewell::kSwitcherVisible, Means::Code, "never"},
+    {Role::Presentation, kOthers, slidewell::kName, Means::Code, "the title of the window"},
 
     // The photo library.
+    {Role::PhotoLibrary, "org.gnome.eog", snapvale::kSlideshowRunning, Means::Code, "the state of the action `win.view-slideshow`"},
+    {Role::PhotoLibrary, "org.gnome.gThumb", snapvale::kSlideshowRunning, Means::Code, "whether a full-screen window stands beside the ordinary one"},
+    {Role::PhotoLibrary, "org.gnome.Shotwell", snapvale::kSlideshowRunning, Means::Code, "whether a full-screen window stands beside the ordinary one"},
+    {Role::PhotoLibrary, kOthers, snapvale::kSlideshowRunning, Means::Code, "whether a window is full screen and the program is not Stopped as a player"},
+    {Role::PhotoLibrary, "org.gnome.eog", snapvale::kStartSlideshow, Means::Action, "win.view-slideshow=true"},
+    {Role::PhotoLibrary, "org.gnome.gThumb", snapvale::kStartSlideshow, Means::Action, "win.slideshow"},
+    {Role::PhotoLibrary, "org.kde.gwenview", snapvale::kStartSlideshow, Means::Mpris, "Play"},
+    {Role::PhotoLibrary, kOthers, snapvale::kStartSlideshow, Means::Key, "F5"},
+    {Role::PhotoLibrary, "org.gnome.eog", snapvale::kStopSlideshow, Means::Action, "win.view-slideshow=false"},
+    {Role::PhotoLibrary, "org.kde.gwenview", snapvale::kStopSlideshow, Means::Mpris, "Stop"},
+    {Role::PhotoLibrary, kOthers, snapvale::kStopSlideshow, Means::Key, "Escape"},
+    {Role::PhotoLibrary, kOthers, snapvale::kSelect, Means::Code, "goes to the next or the previous photo, as follows"},
+    {Role::PhotoLibrary, "org.gnome.eog", words::kNextAlbum, Means::Action, "win.go-next"},
+    {Role::PhotoLibrary, "org.gnome.eog", words::kPreviousAlbum, Means::Action, "win.go-previous"},
+    {Role::PhotoLibrary, "org.gnome.gThumb", words::kNextAlbum, Means::Action, "win.show-next-image"},
+    {Role::PhotoLibrary, "org.gnome.gThumb", words::kPreviousAlbum, Means::Action, "win.show-previous-image"},
+    {Role::PhotoLibrary, "org.kde.gwenview", words::kNextAlbum, Means::Mpris, "Next"},
+    {Role::PhotoLibrary, "org.kde.gwenview", words::kPreviousAlbum, Means::Mpris, "Previous"},
+    {Role::PhotoLibrary, kOthers, words::kNextAlbum, Means::Key, "Right"},
+    {Role::PhotoLibrary, kOthers, words::kPreviousAlbum, Means::Key, "Left"},
+    {Role::PhotoLibrary, kOthers, snapvale::kCurrentAlbum, Means::Code, "the sixth of seven made up, so that it has a neighbour on either side"},
+    {Role::PhotoLibrary, kOthers, snapvale::kName, Means::Code, "the number of an album"},
+    {Role::PhotoLibrary, kOthers, snapvale::kID, Means::Code, "the number of an album"},
+    {Role::PhotoLibrary, "org.gnome.eog", words::kSpace, Means::Action, "win.pause-slideshow"},
+    {Role::PhotoLibrary, "org.kde.gwenview", words::kSpace, Means::Mpris, "PlayPause"},
+    {Role::PhotoLibrary, "org.gnome.eog", words::kCommandEscape, Means::Action, "win.view-fullscreen"},
+    {Role::PhotoLibrary, "org.gnome.gThumb", words::kCommandEscape, Means::Action, "win.fullscreen"},
+    {Role::PhotoLibrary, kOthers, words::kCommandEscape, Means::Key, "F11"},
 
     // Professional photos.
+    {Role::ProfessionalPhotos, "org.darktable.darktable", words::kShiftS, Means::Key, "s"},
+    {Role::ProfessionalPhotos, "org.darktable.darktable", words::kReturn, Means::Key, "F11"},
+    {Role::ProfessionalPhotos, "org.darktable.darktable", words::kEscape, Means::Key, "Escape F11"},
+    {Role::ProfessionalPhotos, "org.kde.digikam", words::kShiftS, Means::Key, "F9"},
+    {Role::ProfessionalPhotos, "org.kde.digikam", words::kReturn, Means::Nothing, "the show has begun"},
 };
 // clang-format on
 

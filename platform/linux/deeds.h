@@ -15,7 +15,7 @@ enum class Means : std::uint8_t {
   Mpv,      ///< a command for mpv's JSON channel, its words blank-separated
   Rc,       ///< a line for VLC's rc interface
   Action,   ///< a GTK action of the program's window or application ("win.presentation", "app.quit=…")
-  Key,      ///< a key for the program's window ("F5", "Shift+m")
+  Key,      ///< keys for the program's window ("F5", "Shift+m", "Escape F11")
   Code,     ///< written out in the role's own file; the text tells what it does
   Nothing,  ///< succeeds and does nothing, because the texts around it do the real work
 };
@@ -27,7 +27,7 @@ struct Deed {
   Role role;
   /// The desktop entry, without ".desktop".
   const char* program;
-  /// Command or property of the role's dictionary.
+  /// Command or property of the role's dictionary, or one of own_words.h.
   tarnscript::Code word;
   Means means;
   const char* how;
