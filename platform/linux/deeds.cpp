@@ -64,7 +64,7 @@ constexpr Deed kDeeds[] = {
     {Role::DiscPlayer, "vlc", spindle::kGoToMainMenu, Means::Rc, "key key-disc-menu"},
     {Role::DiscPlayer, "vlc", spindle::kGoToMainMenu, Means::Key, "Shift+m"},
     {Role::DiscPlayer, "vlc", spindle::kGoReturn, Means::Code, "over rc: to where the film was left for the menu, else to the beginning of title 1"},
-    {Role::DiscPlayer, kOthers, spindle::kGoToBeginning, Means::Code, "stops a disc and plays it again if it played; a file goes to its beginning"},
+    {Role::DiscPlayer, kOthers, spindle::kGoToBeginning, Means::Code, "plays a disc anew; a file goes to its beginning"},
     {Role::DiscPlayer, "vlc", spindle::kPressUp, Means::Rc, "key key-nav-up"},
     {Role::DiscPlayer, "vlc", spindle::kPressUp, Means::Key, "Up"},
     {Role::DiscPlayer, "vlc", spindle::kPressDown, Means::Rc, "key key-nav-down"},

@@ -177,21 +177,21 @@ void DiscPlayer::returnToFilm() const {
   startPlaying(instance());
 }
 
-/// A disc is stopped for that: what it shows first is for the disc to say.
+/// A disc is put in anew, so to speak, and plays: what it shows first is for the disc to say.
 void DiscPlayer::goToBeginning() const {
   const PlayerState state = stateOf(player());
   if (!hasMedia(player(), state)) throw Refusal{"there is no disc"};
+  // What is stopped begins there anyway.
   if (state.status == PlaybackStatus::Stopped) return;
   endFastPlaying(player());
-  if (!isDisc(state)) return seekTo(player(), state, 0);
-  invoke(player(), "Stop");
-  if (state.status == PlaybackStatus::Playing) startPlaying(instance());
+  if (isDisc(state) && !state.trackID.empty()) return goToTrack(player(), state.trackID);
+  seekTo(player(), state, 0);
 }
 
 /// A menu that was paused would show no buttons when one comes back to it.
 void DiscPlayer::stop() const {
   if (showsMenu(stateOf(player()))) {
-    invoke(player(), "Stop");
+    desktop::stop(player());
   } else {
     standStill(player());
   }

@@ -185,6 +185,15 @@ void pause(Player& player) {
   if (statusOf(player) == PlaybackStatus::Playing) bringTo(player, PlaybackStatus::Paused, "Pause");
 }
 
+void stop(Player& player) {
+  if (statusOf(player) != PlaybackStatus::Stopped) bringTo(player, PlaybackStatus::Stopped, "Stop");
+}
+
+void goToTrack(Player& player, const std::string& trackID) {
+  believe(player, PlaybackStatus::Playing);
+  command(player, {mpris::kPath, mpris::kTrackListInterface, "GoTo"}, "o", trackID.c_str());
+}
+
 void invoke(Player& player, const char* member) {
   player.status.reset();
   player.wish.reset();

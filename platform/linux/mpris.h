@@ -91,6 +91,10 @@ std::vector<std::string> trackListOf(Player& player);
 // status differs.
 void play(Player& player);
 void pause(Player& player);
+/// Ends what plays; in some players, the player.
+void stop(Player& player);
+/// Plays an entry of trackListOf from its beginning.
+void goToTrack(Player& player, const std::string& trackID);
 /// Next, Previous, or another method of org.mpris.MediaPlayer2.Player without arguments.
 void invoke(Player& player, const char* member);
 /// Times in microseconds; before the beginning is the beginning.

@@ -1,9 +1,11 @@
 #include "platform/linux/mpv_channel.h"
 
 #include <algorithm>
+#include <iterator>
 #include <nlohmann/json.hpp>
 
 #include "platform/linux/channel.h"
+#include "platform/linux/process.h"
 #include "platform/tarnscript/tarnscript.h"
 
 namespace desktop {
@@ -12,17 +14,24 @@ namespace {
 
 using Json = nlohmann::json;
 
-constexpr std::string_view kExecutable = "mpv";
+/// Programs that are mpv, or have it inside and open its channel when it is told to.
+constexpr std::string_view kExecutables[] = {"mpv", "celluloid"};
 
 /// On a connection of its own every request may have the same number.
 constexpr int kRequest = 1;
 
 constexpr int kTextMilliseconds = 2000;
 
+std::string_view executableOf(pid_t process) {
+  const std::string name = executableName(process);
+  const auto* const known = std::find(std::begin(kExecutables), std::end(kExecutables), name);
+  return known != std::end(kExecutables) ? *known : kExecutables[0];
+}
+
 /// Sends a command, a list of words and numbers, and waits until mpv has carried it out. False where it
 /// cannot.
 bool request(pid_t process, Json command, Microseconds limit) {
-  Channel channel(process, kExecutable, limit);
+  Channel channel(process, executableOf(process), limit);
   const Json message = {{"command", std::move(command)}, {"request_id", kRequest}};
   if (!channel.isOpen() ||
       !channel.write(message.dump(-1, ' ', false, Json::error_handler_t::replace) + "\n")) {
@@ -39,7 +48,7 @@ bool request(pid_t process, Json command, Microseconds limit) {
 
 }  // namespace
 
-bool hasMpvChannel(pid_t process) { return !channelPath(process, kExecutable).empty(); }
+bool hasMpvChannel(pid_t process) { return !channelPath(process, executableOf(process)).empty(); }
 
 void mpvCommand(pid_t process, std::string_view command) {
   Json words = Json::array();

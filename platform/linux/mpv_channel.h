@@ -12,7 +12,7 @@
 
 namespace desktop {
 
-/// Whether the process is an mpv that has opened its channel.
+/// Whether the process is an mpv, or a program around it, that has opened its channel.
 bool hasMpvChannel(pid_t process);
 
 /// Carries out a command, its words blank-separated ("frame-step", "set pause yes"); the last word that a
