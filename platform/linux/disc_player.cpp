@@ -38,6 +38,7 @@ enum class Way : std::uint8_t {
   Channel,   ///< by its number, over VLC's channel
   Keys,      ///< one on or back, by VLC's keys: it does not tell where it stands
   PlayList,  ///< one on or back in the play list
+  None,      ///< a menu has no chapters
 };
 
 /// A chapter, counted from 1, and how many there are.
@@ -122,6 +123,7 @@ Chapter placeInPlayList(Player& player, const PlayerState& state) {
 }
 
 Chapter DiscPlayer::chapter(const PlayerState& state) const {
+  if (showsMenu(state)) return {1, 1, Way::None};
   const auto told = vlcChapter(instance().process);
   if (told && told->count > 1) return {told->number + 1, told->count, Way::Channel};
   if (isDisc(state) && instance().program != nullptr) return {2, 3, Way::Keys};
@@ -131,7 +133,7 @@ Chapter DiscPlayer::chapter(const PlayerState& state) const {
 void DiscPlayer::goToChapter(int wanted) const {
   const PlayerState state = stateOf(player());
   const Chapter now = chapter(state);
-  if (wanted < 1 || wanted > now.count) throw Refusal{"there is no such chapter"};
+  if (wanted < 1 || wanted > now.count || now.way == Way::None) throw Refusal{"there is no such chapter"};
   endFastPlaying(player());
   const bool onward = wanted > now.number;
   if (wanted == now.number && (wanted == 1 || now.way != Way::Channel)) {
