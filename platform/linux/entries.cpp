@@ -1,8 +1,8 @@
 #include "platform/linux/entries.h"
 
 #include <fcntl.h>
-#include <gio/gdesktopappinfo.h>
 #include <poll.h>
+#include <spawn.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -11,128 +11,33 @@
 #include <cerrno>
 #include <chrono>
 #include <csignal>
-#include <functional>
-#include <memory>
+#include <cstdlib>
+#include <filesystem>
 #include <optional>
+#include <system_error>
 
+#include "platform/base/sockets.h"
+#include "platform/linux/entry_records.h"
 #include "platform/tarnscript/text.h"
 
 namespace desktop {
 
 namespace {
 
-constexpr const char* kCastKey = "X-Kvd-Application";
-constexpr const char* kMusicTypes[] = {"audio/mpeg", "audio/flac", "audio/x-vorbis+ogg"};
-
-/// Reading some hundred entries from a cold disk takes a second; a child that takes longer is given up.
+/// Reading some hundred entries from a cold disk takes a second; a reader that takes longer is given up.
 constexpr std::chrono::seconds kReadingLimit{3};
 /// No desktop has that much to say about players.
 constexpr std::size_t kLongestReport = 1 << 20;
 
-// What the child writes: a record a program, fields ended by kFieldEnd, records by kRecordEnd. Neither byte
-// can stand in a desktop entry's value.
-constexpr char kFieldEnd = '\x1f';
-constexpr char kRecordEnd = '\x1e';
-
-struct StringReleaser {
-  void operator()(char* text) const { g_free(text); }
-};
-using OwnedText = std::unique_ptr<char, StringReleaser>;
-
-std::string textOf(const char* text) { return text != nullptr ? text : ""; }
-
-std::string withoutSuffix(std::string id) {
-  constexpr std::string_view kSuffix = ".desktop";
-  if (id.ends_with(kSuffix)) id.resize(id.size() - kSuffix.size());
-  return id;
+/// Where the reader is: beside kvd in a build tree, in its own directory when installed.
+std::string readerPath() {
+  std::error_code error;
+  const std::filesystem::path directory =
+      std::filesystem::read_symlink("/proc/self/exe", error).parent_path();
+  const std::filesystem::path beside = directory / "kvd-entries";
+  if (access(beside.c_str(), X_OK) == 0) return beside;
+  return directory / KVD_LIBEXEC_FROM_BIN / "kvd-entries";
 }
-
-// ---- In the child
-
-bool has(std::string_view categories, std::string_view category) {
-  for (std::size_t at = 0; at <= categories.size();) {
-    const std::size_t end = std::min(categories.find(';', at), categories.size());
-    if (categories.substr(at, end - at) == category) return true;
-    at = end + 1;
-  }
-  return false;
-}
-
-/// The role that the categories suggest (Desktop Menu Specification 1.1).
-Role roleByCategories(std::string_view categories) {
-  if (has(categories, "WebBrowser")) return Role::None;
-  if (has(categories, "Presentation")) return Role::Presentation;
-  if (has(categories, "Photography")) {
-    return has(categories, "Viewer") ? Role::PhotoLibrary : Role::ProfessionalPhotos;
-  }
-  if (!has(categories, "Player")) return Role::None;
-  if (has(categories, "Video")) return Role::ModernMovies;
-  return has(categories, "Audio") || has(categories, "Music") ? Role::Jukebox : Role::None;
-}
-
-void describe(GDesktopAppInfo* info, std::string& report) {
-  const std::string id = withoutSuffix(textOf(g_app_info_get_id(G_APP_INFO(info))));
-  const bool cast = g_desktop_app_info_has_key(info, kCastKey) != FALSE;
-  const OwnedText castAs(cast ? g_desktop_app_info_get_string(info, kCastKey) : nullptr);
-  const Program* const known = programByEntry(id);
-  Role role =
-      known != nullptr ? known->role : roleByCategories(textOf(g_desktop_app_info_get_categories(info)));
-  if (cast) role = roleOf(textOf(castAs.get()));
-  if (role == Role::None && !cast) return;
-
-  const OwnedText directory(g_desktop_app_info_get_string(info, "Path"));
-  const bool activatable = g_desktop_app_info_get_boolean(info, "DBusActivatable") != FALSE;
-  const auto put = [&](const std::string& field) { report.append(field).push_back(kFieldEnd); };
-  put(id);
-  put(textOf(g_desktop_app_info_get_startup_wm_class(info)));
-  put(std::to_string(static_cast<int>(role)));
-  put(cast ? "1" : "0");
-  put(activatable ? "1" : "0");
-  put(textOf(directory.get()));
-  gchar** arguments = nullptr;
-  // A program for a terminal cannot be started without one.
-  const bool startable = g_desktop_app_info_get_boolean(info, "Terminal") == FALSE;
-  const char* const line = startable ? g_app_info_get_commandline(G_APP_INFO(info)) : nullptr;
-  if (line != nullptr && g_shell_parse_argv(line, nullptr, &arguments, nullptr) != FALSE) {
-    for (gchar** argument = arguments; *argument != nullptr; ++argument) {
-      const std::string_view text = *argument;
-      // %f, %U, %i and the like stand for files and decoration that are not given here.
-      if (text.size() == 2 && text[0] == '%' && text[1] != '%') continue;
-      put(text == "%%" ? "%" : std::string(text));
-    }
-    g_strfreev(arguments);
-  }
-  report.push_back(kRecordEnd);
-}
-
-std::string reportEntries() {
-  std::string report;
-  GList* const all = g_app_info_get_all();
-  for (GList* item = all; item != nullptr; item = item->next) {
-    if (G_IS_DESKTOP_APP_INFO(item->data)) describe(G_DESKTOP_APP_INFO(item->data), report);
-  }
-  return report;
-}
-
-std::string reportDefaultMusicPlayer() {
-  for (const char* type : kMusicTypes) {
-    GAppInfo* const info = g_app_info_get_default_for_type(type, FALSE);
-    if (info != nullptr) return withoutSuffix(textOf(g_app_info_get_id(info)));
-  }
-  return {};
-}
-
-[[noreturn]] void report(int output, const std::function<std::string()>& make) {
-  const std::string text = make();
-  for (std::size_t written = 0; written < text.size();) {
-    const ssize_t count = write(output, text.data() + written, text.size() - written);
-    if (count < 0 && errno != EINTR) _exit(1);
-    if (count > 0) written += static_cast<std::size_t>(count);
-  }
-  _exit(0);
-}
-
-// ---- In the daemon
 
 /// Everything that comes out of the descriptor until it ends; nothing when that takes too long.
 std::optional<std::string> readToEnd(int input) {
@@ -152,23 +57,47 @@ std::optional<std::string> readToEnd(int input) {
   return std::nullopt;
 }
 
-/// What `make` says in a child process; nothing when it failed.
-std::optional<std::string> inChild(const std::function<std::string()>& make) {
+/// Starts the reader with its output in `output`. 0 when it could not be started.
+pid_t startReader(const char* option, int output) {
+  posix_spawn_file_actions_t files;
+  posix_spawnattr_t attributes;
+  posix_spawn_file_actions_init(&files);
+  posix_spawnattr_init(&attributes);
+  posix_spawn_file_actions_adddup2(&files, output, STDOUT_FILENO);
+  // This process blocks the signals that end it and ignores SIGPIPE; both would be inherited.
+  sigset_t none;
+  sigset_t pipes;
+  sigemptyset(&none);
+  sigemptyset(&pipes);
+  sigaddset(&pipes, SIGPIPE);
+  posix_spawnattr_setsigmask(&attributes, &none);
+  posix_spawnattr_setsigdefault(&attributes, &pipes);
+  posix_spawnattr_setflags(&attributes, POSIX_SPAWN_SETSIGMASK | POSIX_SPAWN_SETSIGDEF);
+
+  const std::string path = readerPath();
+  char* const arguments[] = {const_cast<char*>(path.c_str()), const_cast<char*>(option), nullptr};
+  pid_t reader = 0;
+  if (posix_spawn(&reader, path.c_str(), &files, &attributes, arguments, environ) != 0) reader = 0;
+  posix_spawnattr_destroy(&attributes);
+  posix_spawn_file_actions_destroy(&files);
+  return reader;
+}
+
+/// What the reader says; nothing when it failed.
+std::optional<std::string> askReader(const char* option) {
   int ends[2];
   if (pipe2(ends, O_CLOEXEC) != 0) return std::nullopt;
-  const pid_t child = fork();
-  if (child == 0) report(ends[1], make);
-  close(ends[1]);
-  std::optional<std::string> text;
-  if (child > 0) {
-    text = readToEnd(ends[0]);
-    if (!text) kill(child, SIGKILL);
-    int status = 0;
-    while (waitpid(child, &status, 0) < 0 && errno == EINTR) {
-    }
-    if (!WIFEXITED(status) || WEXITSTATUS(status) != 0) text.reset();
+  const base::FileDescriptor output(ends[0]);
+  base::FileDescriptor input(ends[1]);
+  const pid_t reader = startReader(option, input.get());
+  input = base::FileDescriptor();
+  if (reader == 0) return std::nullopt;
+  std::optional<std::string> text = readToEnd(output.get());
+  if (!text) kill(reader, SIGKILL);
+  int status = 0;
+  while (waitpid(reader, &status, 0) < 0 && errno == EINTR) {
   }
-  close(ends[0]);
+  if (!WIFEXITED(status) || WEXITSTATUS(status) != 0) text.reset();
   return text;
 }
 
@@ -201,18 +130,25 @@ std::vector<Entry> parse(const std::string& text) {
   return parsed;
 }
 
+/// The directories of shared data, most important first (XDG Base Directory Specification 0.8).
+std::vector<std::string> dataDirectories() {
+  const auto variable = [](const char* name, const std::string& otherwise) {
+    const char* const value = std::getenv(name);
+    return value != nullptr && *value != '\0' ? std::string(value) : otherwise;
+  };
+  std::vector<std::string> directories =
+      split(variable("XDG_DATA_DIRS", "/usr/local/share/:/usr/share/"), ':');
+  directories.insert(directories.begin(), variable("XDG_DATA_HOME", variable("HOME", "") + "/.local/share"));
+  return directories;
+}
+
 /// When the application directories were last changed, one after the other.
 std::vector<std::int64_t> directoryTimes() {
   std::vector<std::int64_t> times;
-  const auto add = [&](const char* directory) {
+  for (const std::string& directory : dataDirectories()) {
     struct stat found {};
-    const std::string applications = std::string(directory) + "/applications";
-    const bool there = stat(applications.c_str(), &found) == 0;
+    const bool there = stat((directory + "/applications").c_str(), &found) == 0;
     times.push_back(there ? found.st_mtim.tv_sec * 1'000'000'000LL + found.st_mtim.tv_nsec : 0);
-  };
-  add(g_get_user_data_dir());
-  for (const char* const* directory = g_get_system_data_dirs(); *directory != nullptr; ++directory) {
-    add(*directory);
   }
   return times;
 }
@@ -231,10 +167,9 @@ const std::vector<Entry>& entries() {
   static std::vector<std::int64_t> sTimes;
   std::vector<std::int64_t> times = directoryTimes();
   if (times == sTimes) return sEntries;
-  if (const auto text = inChild(reportEntries)) {
-    sEntries = parse(*text);
-    sTimes = std::move(times);
-  }
+  // A reader that failed is not tried again before something has changed: it may have taken its full time.
+  sTimes = std::move(times);
+  if (const auto text = askReader(nullptr)) sEntries = parse(*text);
   return sEntries;
 }
 
@@ -251,7 +186,7 @@ const Entry* entryByWindowClass(std::string_view windowClass) {
 }
 
 std::string defaultMusicPlayer() {
-  const std::string id = inChild(reportDefaultMusicPlayer).value_or("");
+  const std::string id = askReader(kDefaultMusicPlayerOption).value_or("");
   const Entry* const entry = entryByID(id);
   return entry != nullptr && entry->role == Role::Jukebox ? entry->id : "";
 }
