@@ -5,5 +5,5 @@
 BUILD_PACKAGES=(g++ cmake ninja-build libncurses-dev)
 
 # To build kvd itself.
-DESKTOP_LIBRARIES=(pkg-config libsystemd-dev libxcb1-dev libxcb-ewmh-dev libxcb-icccm4-dev libxcb-keysyms1-dev
-  libxcb-randr0-dev libxcb-res0-dev libpulse-dev libglib2.0-dev)
+DESKTOP_LIBRARIES=(pkgconf libsystemd-dev libxcb1-dev libxcb-randr0-dev libxcb-res0-dev libpulse-dev libglib2.0-dev
+  nlohmann-json3-dev)
