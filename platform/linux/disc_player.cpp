@@ -195,7 +195,7 @@ void DiscPlayer::stop() const {
   if (showsMenu(stateOf(player()))) {
     desktop::stop(player());
   } else {
-    standStill(player());
+    endPlaying(instance());
   }
 }
 
@@ -253,7 +253,7 @@ Value DiscPlayer::perform(const tarnscript::Event& event) {
       startPlaying(instance());
       break;
     case words::kPauseDVD:
-      standStill(player());
+      endPlaying(instance());
       break;
     case words::kStopDVD:
       stop();

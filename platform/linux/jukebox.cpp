@@ -116,11 +116,11 @@ Value Jukebox::perform(const tarnscript::Event& event) {
       break;
     case words::kPause:
     case words::kStop:
-      standStill(player());
+      endPlaying(instance());
       break;
     case words::kPlayPause:
       if (isPlaying(player())) {
-        standStill(player());
+        endPlaying(instance());
       } else {
         startPlaying(instance());
       }

@@ -125,14 +125,14 @@ void MoviePlayer::step(const tarnscript::Event& event, std::int64_t offset) {
 
 Value MoviePlayer::perform(const tarnscript::Event& event) {
   const auto* const direct = event.direct ? std::get_if<ObjectRef>(&*event.direct) : nullptr;
-  Player& player = playerOfFilm(direct != nullptr ? *direct : event.target);
+  playerOfFilm(direct != nullptr ? *direct : event.target);
   switch (event.command) {
     case words::kPlay:
       startPlaying(instance());
       break;
     case words::kPause:
     case words::kStop:
-      standStill(player);
+      endPlaying(instance());
       break;
     case words::kStepForward:
       step(event, kStep);

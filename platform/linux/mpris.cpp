@@ -1,7 +1,9 @@
 #include "platform/linux/mpris.h"
 
 #include <algorithm>
+#include <charconv>
 
+#include "platform/base/utf8.h"
 #include "platform/host.h"
 #include "platform/linux/bus_values.h"
 #include "platform/linux/mpris_names.h"
@@ -54,6 +56,24 @@ std::string usableTrackID(const std::string& text) {
   return text;
 }
 
+/// The last part of an address as people read it: "film%201.mkv" is "film 1.mkv".
+std::string fileName(std::string_view url) {
+  const std::string_view part = url.substr(url.rfind('/') + 1);
+  std::string name;
+  for (std::size_t i = 0; i < part.size(); ++i) {
+    unsigned char byte = 0;
+    const char* const digits = part.data() + i + 1;
+    if (part[i] == '%' && i + 2 < part.size() &&
+        std::from_chars(digits, digits + 2, byte, 16).ptr == digits + 2 && byte != 0) {
+      name.push_back(static_cast<char>(byte));
+      i += 2;
+    } else {
+      name.push_back(part[i]);
+    }
+  }
+  return base::isUTF8(name) ? name : std::string(part);
+}
+
 void readMetadata(sd_bus_message* message, PlayerState& state) {
   readDictionary(message, [&](std::string_view key, std::string_view type) {
     if (key == "mpris:trackid") state.trackID = usableTrackID(readText(message, type).value_or(""));
@@ -62,6 +82,7 @@ void readMetadata(sd_bus_message* message, PlayerState& state) {
     if (key == "xesam:url") state.url = readText(message, type).value_or("");
   });
   if (state.length == 0) state.length.reset();
+  if (state.title.empty()) state.title = fileName(state.url);
 }
 
 void readProperty(sd_bus_message* message, std::string_view key, std::string_view type, PlayerState& state) {

@@ -70,6 +70,7 @@ struct PlayerState {
   std::optional<std::int64_t> length;
   /// An object path, "" where the player has none that can be sent back to it.
   std::string trackID;
+  /// The name of the file where what plays has no title.
   std::string title;
   /// What it plays, an address.
   std::string url;

@@ -61,7 +61,9 @@ void mpvCommand(pid_t process, std::string_view command) {
 }
 
 bool showMpvText(pid_t process, std::string_view text) {
-  return request(process, Json::array({"show-text", std::string(text), kTextMilliseconds}), kQueryLimit);
+  // "$>" keeps mpv from reading "${…}" in it.
+  return request(process, Json::array({"show-text", "$>" + std::string(text), kTextMilliseconds}),
+                 kQueryLimit);
 }
 
 }  // namespace desktop

@@ -12,6 +12,11 @@ namespace {
 /// From here on a rate is a scan's, which somebody else may have begun, and not one at which people watch.
 constexpr double kSlowestScan = 2;
 
+void standStill(Player& player) {
+  pause(player);
+  endFastPlaying(player);
+}
+
 /// Only one plays at a time, in one role too.
 void pauseOthers(const Instance& chosen) {
   for (const Instance* other : instancesOf(chosen.role)) {
@@ -40,9 +45,9 @@ void startPlaying(const Instance& instance) {
   play(player);
 }
 
-void standStill(Player& player) {
-  pause(player);
-  endFastPlaying(player);
+void endPlaying(const Instance& instance) {
+  pauseOthers(instance);
+  standStill(requirePlayer(instance));
 }
 
 bool isPlaying(Player& player) { return scanRate(player) || statusOf(player) == PlaybackStatus::Playing; }

@@ -12,8 +12,8 @@ Player& requirePlayer(const Instance& instance);
 /// Plays at the player's own rate, and pauses what else plays in the same role.
 void startPlaying(const Instance& instance);
 
-/// Pauses: the sound ends; window, film and place stay.
-void standStill(Player& player);
+/// Pauses it, and whatever else plays in the same role: the sound ends; window, film and place stay.
+void endPlaying(const Instance& instance);
 
 /// Whether it plays, at whatever rate, or is scanned.
 bool isPlaying(Player& player);
