@@ -66,6 +66,8 @@ class Application : public tarnscript::Application {
   virtual void advance() {}
   /// Its state in a few words, for people; empty when there is nothing to say.
   virtual std::string describe() const { return {}; }
+  /// What changes too often for that, and its settings: a position, a volume; empty when there is nothing.
+  virtual std::string details() const { return {}; }
 
  protected:
   // What a model answers to scripts. The defaults refuse.

@@ -86,6 +86,12 @@ std::string Lyrabox::describe() const {
   return {};
 }
 
+std::string Lyrabox::details() const {
+  const std::string volume = "volume " + std::to_string(volume_);
+  if (state_ == State::Stopped) return volume;
+  return positionText(playhead_.position()) + "/" + positionText(duration()) + ", " + volume;
+}
+
 void Lyrabox::enter(State state, Nanoseconds when) {
   if (state == state_) return;
   state_ = state;

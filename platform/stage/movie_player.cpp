@@ -70,6 +70,13 @@ std::string MoviePlayer::describe() const {
   return movies_.empty() ? "nothing open" : describe(movies_.front());
 }
 
+std::string MoviePlayer::details() const {
+  if (movies_.empty()) return {};
+  const Movie& front = movies_.front();
+  return positionText(front.playhead.position()) + "/" + positionText(front.length) + ", volume " +
+         numberText(front.volume);
+}
+
 MoviePlayer::Movie& MoviePlayer::movieOf(const ObjectRef& object) {
   const auto found =
       std::find_if(movies_.begin(), movies_.end(), [&](const Movie& movie) { return movie.id == object.id; });

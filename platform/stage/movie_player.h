@@ -22,6 +22,7 @@ class MoviePlayer final : public Application {
   std::optional<Nanoseconds> nextChange() const override;
   void advance() override;
   std::string describe() const override;
+  std::string details() const override;
 
  protected:
   tarnscript::Value read(const tarnscript::ObjectRef& object, tarnscript::Code property) override;

@@ -46,6 +46,8 @@ std::string Snapvale::describe() const {
   return slideshow_.running ? album + ", " + slideshow_.describe() : album;
 }
 
+std::string Snapvale::details() const { return version.empty() ? "no version" : "version " + version; }
+
 void Snapvale::select(std::size_t album) {
   album_ = album;
   changed(describe());

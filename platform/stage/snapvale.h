@@ -18,6 +18,7 @@ class Snapvale final : public Application {
   void receiveKey(std::uint16_t virtualKey, bool withShift) override;
   void ended() override;
   std::string describe() const override;
+  std::string details() const override;
 
  protected:
   tarnscript::Value read(const tarnscript::ObjectRef& object, tarnscript::Code property) override;

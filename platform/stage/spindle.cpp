@@ -103,6 +103,10 @@ std::string Spindle::describe() const {
          std::to_string(static_cast<int>(std::abs(playhead_.rate()))) + " from " + place;
 }
 
+std::string Spindle::details() const {
+  return "volume " + std::to_string(volume_) + (muted_ ? ", muted" : "") + (subtitles_ ? ", subtitles" : "");
+}
+
 void Spindle::enter(State state, double rate, Nanoseconds when) {
   if (state == state_ && rate == playhead_.rate()) return;
   state_ = state;

@@ -17,6 +17,7 @@ class Spindle final : public Application {
   std::optional<Nanoseconds> nextChange() const override;
   void advance() override;
   std::string describe() const override;
+  std::string details() const override;
 
   /// Puts a disc in, stopped at its beginning, or takes it out.
   void setDisc(bool present);
