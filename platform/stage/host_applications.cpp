@@ -12,7 +12,9 @@
 namespace {
 
 using stage::Entry;
+using stage::Question;
 using stage::record;
+using stage::recordQuestion;
 
 HostObject* copySerialNumber(const HostProcessSerialNumber& process) {
   return new base::SerialNumber(process);
@@ -82,14 +84,16 @@ HostObject* HostCopyApplicationInformationItem(HostSessionID session, HostSerial
     record(Entry::Question, "asks about an application that has quit");
     return nullptr;
   }
-  record(Entry::Question, "asks whether " + process->application->name + " runs: yes");
+  recordQuestion(Question::WhoRuns, "asks whether " + process->application->name + " runs: yes",
+                 process->application);
   return copyInformation(*process, key);
 }
 
 HostSerialNumberRef HostCopyFrontApplication(HostSessionID session) {
   const auto& front = stage::desktop().front;
   if (session != kHostDefaultSession) return nullptr;
-  record(Entry::Question,
-         "asks who is in front: " + (front ? front->application->name : std::string("nobody")));
+  recordQuestion(Question::WhoIsInFront,
+                 "asks who is in front: " + (front ? front->application->name : std::string("nobody")),
+                 front ? front->application : nullptr);
   return front ? HostSerialNumberRef(copySerialNumber(front->serialNumber)) : nullptr;
 }

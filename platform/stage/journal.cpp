@@ -51,6 +51,12 @@ std::string shortened(std::string_view source) {
   return text;
 }
 
+/// What a script's line ends in.
+void setOutcome(const std::string& separator, std::string outcome) {
+  sOpenScript->text += separator + outcome;
+  sOpenScript->outcome = std::move(outcome);
+}
+
 void closeScript() {
   if (!sOpenScript) return;
   const JournalLine line = *std::exchange(sOpenScript, std::nullopt);
@@ -63,23 +69,28 @@ void setJournalListener(std::function<void(const JournalLine&)> listener) { sLis
 
 void record(Entry kind, std::string text) {
   closeScript();
-  send({kind, std::move(text), now(), {}});
+  send({kind, std::move(text), now(), {}, {}});
+}
+
+void recordQuestion(Question question, std::string text, const Application* about) {
+  closeScript();
+  send({Entry::Question, std::move(text), now(), {}, {}, question, about});
 }
 
 void recordScriptStart(const std::string& source) {
   closeScript();
-  sOpenScript = {Entry::Script, shortened(source), now(), source};
+  sOpenScript = {Entry::Script, shortened(source), now(), source, {}};
 }
 
 void recordScriptEnd(const std::string& answer) {
-  if (sOpenScript && !answer.empty()) sOpenScript->text += " = " + answer;
+  if (sOpenScript && !answer.empty()) setOutcome(" ", "= " + answer);
   closeScript();
 }
 
 void recordScriptFailure(const std::string& message, int line) {
   const std::string failure = "fails in line " + std::to_string(line) + ": " + message;
   if (sOpenScript) {
-    sOpenScript->text += ", " + failure;
+    setOutcome(", ", failure);
     closeScript();
   } else {
     record(Entry::Failure, "the script " + failure);

@@ -8,6 +8,8 @@
 
 namespace stage {
 
+class Application;
+
 enum class Entry {
   Question,      ///< something the daemon asked
   Script,        ///< a script, with what it answered
@@ -24,16 +26,25 @@ enum class Entry {
   Error,         ///< what is wrong with a command
 };
 
+/// What a question of the daemon was about.
+enum class Question { Other, WhoIsInFront, WhoRuns };
+
 struct JournalLine {
   Entry kind;
   std::string text;
   Nanoseconds time;
-  /// Of a script: its whole source.
+  /// Of a script: its whole source, and what it answered or why it failed.
   std::string source;
+  std::string outcome;
+  Question question = Question::Other;
+  /// The application that a question's answer names, if one does.
+  const Application* about = nullptr;
 };
 
 /// Writes one line.
 void record(Entry kind, std::string text);
+/// Writes a question, with the application that the answer names.
+void recordQuestion(Question question, std::string text, const Application* about);
 
 /// Writes that a script runs, shortened for people: to whom, and what.
 void recordScriptStart(const std::string& source);
