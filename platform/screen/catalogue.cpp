@@ -1,24 +1,23 @@
 #include "platform/screen/catalogue.h"
 
-#include "daemon/kvd.h"
-
 namespace live {
 
 namespace {
 
 struct Role {
+  AppCode code;
   std::string_view identifier;
   std::string_view role;
 };
 
 constexpr Role kRoles[] = {
-    {Bundle::Lyrabox, "music jukebox"},
-    {Bundle::Spindle, "disc player"},
-    {Bundle::VistremePlayer, "classic movie player"},
-    {Bundle::VistremePlayerX, "modern movie player"},
-    {Bundle::Slidewell, "presentations"},
-    {Bundle::Snapvale, "photo library"},
-    {Bundle::Lumbra, "professional photos"},
+    {App::Lyra, Bundle::Lyrabox, "music jukebox"},
+    {App::Spin, Bundle::Spindle, "disc player"},
+    {App::Vist, Bundle::VistremePlayer, "classic movie player"},
+    {App::VstX, Bundle::VistremePlayerX, "modern movie player"},
+    {App::Slid, Bundle::Slidewell, "presentations"},
+    {App::Snap, Bundle::Snapvale, "photo library"},
+    {App::Lumb, Bundle::Lumbra, "professional photos"},
 };
 
 }  // namespace
@@ -37,6 +36,13 @@ std::string_view roleOf(const stage::Application& application) {
     if (row.identifier == application.identifier) return row.role;
   }
   return {};
+}
+
+const stage::Application* applicationOf(AppCode code) {
+  for (const Role& row : kRoles) {
+    if (row.code == code) return stage::findApplication(row.identifier);
+  }
+  return nullptr;
 }
 
 }  // namespace live

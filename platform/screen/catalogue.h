@@ -4,6 +4,7 @@
 #include <string_view>
 #include <vector>
 
+#include "daemon/kvd.h"
 #include "platform/stage/desktop.h"
 
 namespace live {
@@ -14,5 +15,8 @@ std::vector<const stage::Application*> openable(const stage::Desktop& desktop);
 
 /// What it is, for somebody who meets its name for the first time: "disc player". Empty when nobody knows.
 std::string_view roleOf(const stage::Application& application);
+
+/// The application of a code, null for the codes that stand for none.
+const stage::Application* applicationOf(AppCode code);
 
 }  // namespace live

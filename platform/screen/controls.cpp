@@ -1,6 +1,7 @@
 #include "platform/screen/controls.h"
 
 #include <algorithm>
+#include <cstdlib>
 #include <utility>
 
 #include "daemon/kvd.h"
@@ -42,7 +43,7 @@ void useRemote(State& state, const RemoteKey& key) {
 
 // ---- The applications ----
 
-const stage::Application* applicationOf(const Keypress& key) {
+const stage::Application* numbered(const Keypress& key) {
   if (key.character < L'1' || key.character > L'9') return nullptr;
   const auto applications = openable(stage::desktop());
   const auto index = static_cast<std::size_t>(key.character - L'1');
@@ -58,9 +59,45 @@ void openOrBringToFront(State& state, const stage::Application& application) {
   perform(state, (application.running() ? "front " : "open ") + wordFor(application));
 }
 
-void closeApplication(State& state, const Keypress& key) {
-  state.closing = false;
-  if (const auto* const application = applicationOf(key)) perform(state, "close " + wordFor(*application));
+/// From obeying to errors, to silence, and back.
+std::string_view nextManner(stage::Manner manner) {
+  switch (manner) {
+    case stage::Manner::Obeys:
+      return " errors";
+    case stage::Manner::Refuses:
+      return " nothing";
+    case stage::Manner::Ignores:
+      break;
+  }
+  return " normally";
+}
+
+void takeDigit(State& state, const Keypress& key) {
+  const Pending pending = std::exchange(state.pending, Pending::Nothing);
+  const auto* const application = numbered(key);
+  if (application == nullptr) return;
+  const std::string word = wordFor(*application);
+  if (pending == Pending::Close) return perform(state, "close " + word);
+  perform(state, "answers " + word + std::string(nextManner(application->manner)));
+}
+
+/// One version of each generation that kvd tells apart.
+constexpr const char* kLibraryVersions[] = {"6.0.6", "7.1.5", "8.1.2"};
+
+void changeLibraryVersion(State& state) {
+  const auto* const library = applicationOf(App::Snap);
+  if (library == nullptr) return;
+  const int generation = std::atoi(library->version.c_str());
+  const auto* const next = std::ranges::find_if(
+      kLibraryVersions, [&](const char* version) { return std::atoi(version) > generation; });
+  perform(state, "version " + wordFor(*library) + " " +
+                     (next != std::end(kLibraryVersions) ? *next : kLibraryVersions[0]));
+}
+
+void captureDisplay(State& state) {
+  const auto& displays = stage::desktop().displays;
+  const bool captured = !displays.empty() && displays.front().capturedByHand;
+  perform(state, captured ? "capture 1 off" : "capture 1 on");
 }
 
 // ---- The command line ----
@@ -68,8 +105,15 @@ void closeApplication(State& state, const Keypress& key) {
 void runTyped(State& state) {
   const std::wstring typed = *std::exchange(state.commandLine, std::nullopt);
   if (typed.empty()) return;
-  state.lastCommand = typed;
+  state.history.push_back(typed);
   perform(state, narrow(typed));
+}
+
+/// Goes through the commands typed before; behind the last of them the line is empty.
+void recall(State& state, std::size_t which) {
+  if (which > state.history.size()) return;
+  state.recalled = which;
+  state.commandLine = which < state.history.size() ? state.history[which] : std::wstring();
 }
 
 void typeCommand(State& state, const Keypress& key) {
@@ -85,8 +129,9 @@ void typeCommand(State& state, const Keypress& key) {
       if (line.empty()) return state.commandLine.reset();
       return line.pop_back();
     case Special::Up:
-      line = state.lastCommand;
-      return;
+      return recall(state, state.recalled - 1);
+    case Special::Down:
+      return recall(state, state.recalled + 1);
     default:
       if (key.character != 0 && line.size() < kLongestCommand) line += key.character;
   }
@@ -99,12 +144,23 @@ void useLetter(State& state, wchar_t letter) {
     case L'0':
       return perform(state, "front nobody");
     case L'x':
-      state.closing = true;
+      state.pending = Pending::Close;
+      return;
+    case L'e':
+      state.pending = Pending::Fail;
       return;
     case L'l':
       return perform(state, gScreenLocked ? "lock off" : "lock on");
+    case L'c':
+      return captureDisplay(state);
+    case L'v':
+      return changeLibraryVersion(state);
+    case L's':
+      state.wholeScripts = !state.wholeScripts;
+      return;
     case L':':
       state.commandLine.emplace();
+      state.recalled = state.history.size();
       return;
     case L'?':
       state.showsHelp = true;
@@ -128,12 +184,13 @@ bool scroll(State& state, const Keypress& key) {
 
 void handle(State& state, const Keypress& key) {
   if (scroll(state, key)) return;
-  state.scrolled = 0;
+  const bool keepsPlace = key.character == L's' && !state.showsHelp && !state.commandLine;
+  if (!keepsPlace) state.scrolled = 0;
   if (std::exchange(state.showsHelp, false) && key.character != L'q') return;
   if (state.commandLine) return typeCommand(state, key);
-  if (state.closing) return closeApplication(state, key);
+  if (state.pending != Pending::Nothing) return takeDigit(state, key);
   if (const RemoteKey* const remote = findRemoteKey(key)) return useRemote(state, *remote);
-  if (const auto* const application = applicationOf(key)) return openOrBringToFront(state, *application);
+  if (const auto* const application = numbered(key)) return openOrBringToFront(state, *application);
   useLetter(state, key.character);
 }
 

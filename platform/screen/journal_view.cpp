@@ -43,21 +43,35 @@ Tone toneOf(stage::Entry kind) {
 
 std::wstring times(std::size_t count) { return L"×" + std::to_wstring(count); }
 
-void append(std::vector<Line>& lines, const Line& line, int columns, int indent) {
+void appendLine(std::vector<Line>& lines, Tone tone, const std::wstring& text, int columns, int indent) {
   const std::wstring margin(static_cast<std::size_t>(indent), L' ');
-  for (const std::wstring& text : wrap(margin + line.text, columns, indent + kIndent)) {
-    lines.push_back({line.tone, text});
+  for (const std::wstring& part : wrap(margin + text, columns, indent + kIndent)) {
+    lines.push_back({tone, part});
   }
+}
+
+std::vector<std::wstring> linesOf(const std::string& source) {
+  std::vector<std::wstring> lines;
+  for (std::size_t begin = 0; begin < source.size();) {
+    const std::size_t end = std::min(source.find('\n', begin), source.size());
+    lines.push_back(widen(source.substr(begin, end - begin)));
+    begin = end + 1;
+  }
+  return lines;
 }
 
 }  // namespace
 
-void JournalView::add(const stage::JournalLine& line) { push({toneOf(line.kind), widen(line.text)}); }
+void JournalView::add(const stage::JournalLine& line) {
+  push({{toneOf(line.kind), widen(line.text)}, linesOf(line.source), widen(line.outcome)});
+}
 
-void JournalView::addCommand(const std::string& command) { push({Tone::Command, L"▸ " + widen(command)}); }
+void JournalView::addCommand(const std::string& command) {
+  push({{Tone::Command, L"▸ " + widen(command)}, {}, {}});
+}
 
-void JournalView::push(Line line) {
-  blocks_.push_back({{{std::move(line), 1}}, 1});
+void JournalView::push(Row row) {
+  blocks_.push_back({{std::move(row)}, 1});
   if (blocks_.size() > kMostBlocks) blocks_.pop_front();
   bool folded = foldRow();
   for (std::size_t length = 2; !folded && length <= kLongestBlock; ++length) {
@@ -106,25 +120,32 @@ bool JournalView::foldIntoNewBlock(std::size_t length) {
   return true;
 }
 
-std::vector<Line> JournalView::render(const Block& block, int columns) {
+void JournalView::append(std::vector<Line>& lines, const Row& row, int columns, int indent,
+                         bool wholeScripts) {
+  const std::wstring count = row.count > 1 ? L" " + times(row.count) : std::wstring();
+  const auto& [tone, text] = row.line;
+  if (!wholeScripts || row.source.empty()) return appendLine(lines, tone, text + count, columns, indent);
+  appendLine(lines, tone, text.substr(0, text.find(L':') + 1) + count, columns, indent);
+  for (const std::wstring& part : row.source) appendLine(lines, tone, part, columns, indent + kIndent);
+  if (!row.outcome.empty()) appendLine(lines, Tone::Answer, row.outcome, columns, indent + kIndent);
+}
+
+std::vector<Line> JournalView::render(const Block& block, int columns, bool wholeScripts) {
   std::vector<Line> lines;
   int indent = block.rows[0].line.tone == Tone::Command ? 0 : kIndent;
   if (block.count > 1) {
-    append(lines, {Tone::Answer, times(block.count) + L":"}, columns, indent);
+    appendLine(lines, Tone::Answer, times(block.count) + L":", columns, indent);
     indent += kIndent;
   }
-  for (const Row& row : block.rows) {
-    const std::wstring count = row.count > 1 ? L" " + times(row.count) : std::wstring();
-    append(lines, {row.line.tone, row.line.text + count}, columns, indent);
-  }
+  for (const Row& row : block.rows) append(lines, row, columns, indent, wholeScripts);
   return lines;
 }
 
-std::vector<Line> JournalView::show(int rows, int columns, int& back) const {
+std::vector<Line> JournalView::show(int rows, int columns, int& back, bool wholeScripts) const {
   const auto wanted = static_cast<std::size_t>(rows + std::max(back, 0));
   std::vector<Line> upwards;
   for (auto block = blocks_.rbegin(); block != blocks_.rend() && upwards.size() < wanted; ++block) {
-    const std::vector<Line> lines = render(*block, columns);
+    const std::vector<Line> lines = render(*block, columns, wholeScripts);
     upwards.insert(upwards.end(), lines.rbegin(), lines.rend());
   }
   back = std::clamp(back, 0, std::max(0, static_cast<int>(upwards.size()) - rows));

@@ -34,13 +34,17 @@ class JournalView {
   void addCommand(const std::string& command);
 
   /// At most `rows` rows of the view at a width, top to bottom, the newest last; without the last `back`
-  /// rows. `back` is held so that the view stays full as long as there is enough to show.
-  std::vector<Line> show(int rows, int columns, int& back) const;
+  /// rows. `back` is held so that the view stays full as long as there is enough to show. With `wholeScripts`
+  /// every script is there as it was sent, line by line, and not in short.
+  std::vector<Line> show(int rows, int columns, int& back, bool wholeScripts) const;
 
  private:
   struct Row {
     Line line;
-    std::size_t count;
+    /// Of a script: its lines, and what it answered.
+    std::vector<std::wstring> source;
+    std::wstring outcome;
+    std::size_t count = 1;
     bool operator==(const Row&) const = default;
   };
   /// One row, or some that came `count` times one after the other.
@@ -56,8 +60,9 @@ class JournalView {
   bool foldRow();
   bool foldIntoBlock(std::size_t length);
   bool foldIntoNewBlock(std::size_t length);
-  void push(Line line);
-  static std::vector<Line> render(const Block& block, int columns);
+  void push(Row row);
+  static void append(std::vector<Line>& lines, const Row& row, int columns, int indent, bool wholeScripts);
+  static std::vector<Line> render(const Block& block, int columns, bool wholeScripts);
 
   std::deque<Block> blocks_;
 };

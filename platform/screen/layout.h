@@ -3,7 +3,7 @@
 
 namespace live {
 
-/// The smallest terminal on which everything has its place.
+/// The smallest terminal on which everything that matters has its place.
 inline constexpr int kFewestRows = 12;
 inline constexpr int kFewestColumns = 40;
 
@@ -15,18 +15,24 @@ struct Box {
   int columns = 0;
 };
 
-/// The parts. Applications, remote and journal have a heading in their first row.
+/// The parts. Applications, remote, other keys and journal have a heading in their first row.
 struct Layout {
   Box title;
+  Box target;
   Box applications;
   Box remote;
+  Box otherKeys;
   Box journal;
   Box hint;
   Box footer;
 };
 
-/// Lays out a terminal that is not too small. The remote's keys stand beside the applications; a narrow
-/// terminal has them below, if it is high enough.
-Layout arrange(int rows, int columns, int applications, int keys);
+/// How many columns the applications have on a terminal of so many.
+int applicationColumns(int columns);
+
+/// Lays out a terminal that is not too small, for applications that take so many lines. From 80 columns on
+/// the journal stands at the side; on a narrower terminal it stands below. What there is no room for is left
+/// out: the other keys first, then the remote, then applications.
+Layout arrange(int rows, int columns, int applicationLines);
 
 }  // namespace live

@@ -12,26 +12,36 @@ namespace {
 using stage::Application;
 using stage::Desktop;
 
-enum Lesson : std::size_t { Open, Front, Play, Pause, Other, Volume, Graduated };
+enum Lesson : std::size_t { Play, Pause, Resume, Other, Volume, Graduated };
+
+/// The players, the two that the lessons like best first: a film, then music.
+constexpr const char* kPlayers[] = {Bundle::Spindle, Bundle::Lyrabox, Bundle::VistremePlayer,
+                                    Bundle::VistremePlayerX};
 
 bool plays(const Application& application) {
   return application.running() && application.nextChange().has_value();
 }
 
-/// The application that the first lessons are about: one that is there, else the disc player.
-const Application* subject(const Desktop& desktop) {
-  if (desktop.front) return desktop.front->application;
-  if (!desktop.running.empty()) return desktop.running.front().application;
-  return stage::findApplication(Bundle::Spindle);
+bool anyPlays(const std::set<const Application*>& applications) {
+  return std::ranges::any_of(applications,
+                             [](const Application* application) { return plays(*application); });
 }
 
-/// One that has not played yet.
-const Application* other(const std::set<const Application*>& played) {
-  for (const char* const identifier : {Bundle::Lyrabox, Bundle::Spindle}) {
-    const Application* const found = stage::findApplication(identifier);
-    if (found != nullptr && !played.contains(found)) return found;
+/// The player that a lesson is about: one that has not played yet, best the one in front, or one that runs.
+const Application* playerFor(const Desktop& desktop, const std::set<const Application*>& played) {
+  const Application* chosen = nullptr;
+  int best = -1;
+  for (const char* const identifier : kPlayers) {
+    const Application* const player = stage::findApplication(identifier);
+    if (player == nullptr || played.contains(player)) continue;
+    const bool inFront = desktop.front && desktop.front->application == player;
+    const int rank = inFront ? 2 : player->running() ? 1 : 0;
+    if (rank > best) {
+      best = rank;
+      chosen = player;
+    }
   }
-  return nullptr;
+  return chosen;
 }
 
 /// The digit that stands for it.
@@ -40,30 +50,35 @@ std::string digit(const Desktop& desktop, const Application& application) {
   return std::to_string(std::ranges::find(applications, &application) - applications.begin() + 1);
 }
 
+/// The next step on the way to a player that is there, in front, and gets the button.
+std::string wayTo(const Desktop& desktop, const Application* player, const std::string& inTheEnd) {
+  if (player == nullptr) return inTheEnd;
+  const std::string key = digit(desktop, *player);
+  if (!player->running())
+    return "Press " + key + " to open " + player->name + ", the " + std::string(roleOf(*player)) + ".";
+  if (!desktop.front || desktop.front->application != player)
+    return "Press " + key + " again: " + player->name + " comes to the front, where the buttons go first.";
+  return inTheEnd;
+}
+
 }  // namespace
 
 void Lessons::observe(const Desktop& desktop) {
   if (loudness_ < 0) loudness_ = desktop.outputVolume;
   for (const auto& application : desktop.installed) {
-    if (plays(*application)) {
-      played_.insert(application.get());
-    } else if (application->running() && played_.contains(application.get())) {
-      paused_ = true;
-    }
+    if (plays(*application)) played_.insert(application.get());
   }
   while (lesson_ < Graduated && learnt(desktop)) ++lesson_;
 }
 
 bool Lessons::learnt(const Desktop& desktop) const {
   switch (lesson_) {
-    case Open:
-      return !desktop.running.empty();
-    case Front:
-      return desktop.front.has_value() || !played_.empty();
     case Play:
       return !played_.empty();
     case Pause:
-      return paused_;
+      return !anyPlays(played_) || played_.size() > 1;
+    case Resume:
+      return anyPlays(played_);
     case Other:
       return played_.size() > 1;
     default:
@@ -72,27 +87,21 @@ bool Lessons::learnt(const Desktop& desktop) const {
 }
 
 std::string Lessons::hint(const Desktop& desktop) const {
-  const Application* const about = lesson_ == Other ? other(played_) : subject(desktop);
-  const std::string key = about != nullptr ? digit(desktop, *about) : "a digit";
-  const std::string name = about != nullptr ? about->name : "an application";
   switch (lesson_) {
-    case Open: {
-      const std::string role(about != nullptr ? roleOf(*about) : "");
-      return "Press " + key + " to open " + name + (role.empty() ? "." : ", the " + role + ".");
-    }
-    case Front:
-      return "Press " + key + " again: " + name + " comes to the front, where the buttons go first.";
     case Play:
-      return "Press Space, which is Play/Pause on the remote, and read below what kvd does.";
+      return wayTo(desktop, playerFor(desktop, {}),
+                   "Press Space, the remote's Play/Pause, and see what kvd asks and does.");
     case Pause:
       return "Something plays. Press Space again to pause it.";
+    case Resume:
+      return "Space once more lets it play on.";
     case Other:
-      return "Let it play again (Space), then " + key + ", " + key + ", Space: " + name +
-             " plays, the other stops.";
+      return wayTo(desktop, playerFor(desktop, played_),
+                   "Press Space: this one plays, and kvd stops what played.");
     case Volume:
-      return "Press + for louder. Or hold it: type :hold volume-up 3s and Enter.";
+      return "Press +: the volume goes up, and on while the button is held.";
     default:
-      return "Try the arrows, other applications, kvremote in another terminal. ? lists the keys.";
+      return "Try other applications, e to make one fail, 0 for nobody in front; ? tells all.";
   }
 }
 

@@ -22,7 +22,6 @@ class Lessons {
   std::size_t lesson_ = 0;
   /// The applications that something has played in.
   std::set<const stage::Application*> played_;
-  bool paused_ = false;
   int loudness_ = -1;  ///< the output volume at the beginning
 };
 

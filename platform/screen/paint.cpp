@@ -1,4 +1,4 @@
-// From the bottom up: putting text into a box, the parts from top to bottom, the whole.
+// From top to bottom, the parts; then the whole.
 
 #include "platform/screen/paint.h"
 
@@ -10,8 +10,10 @@
 #include <vector>
 
 #include "daemon/kvd.h"
-#include "platform/screen/catalogue.h"
+#include "platform/screen/application_rows.h"
+#include "platform/screen/brush.h"
 #include "platform/screen/help.h"
+#include "platform/screen/keys.h"
 #include "platform/screen/layout.h"
 #include "platform/screen/text.h"
 
@@ -19,12 +21,7 @@ namespace live {
 
 namespace {
 
-using stage::Application;
 using stage::Desktop;
-
-enum Color : short { Green = 1, Cyan, Yellow, Red, Magenta };
-
-attr_t colored(Color color) { return static_cast<attr_t>(COLOR_PAIR(color)); }
 
 attr_t attributesOf(Tone tone) {
   switch (tone) {
@@ -33,163 +30,181 @@ attr_t attributesOf(Tone tone) {
     case Tone::Answer:
       return A_NORMAL;
     case Tone::Error:
-      return colored(Red);
+      return colored(Color::Red, A_BOLD);
     case Tone::Question:
       return A_DIM;
     case Tone::Action:
-      return colored(Cyan);
+      return colored(Color::Cyan);
     case Tone::Change:
-      return colored(Green);
+      return colored(Color::Green, A_BOLD);
     case Tone::Service:
-      return colored(Magenta);
+      return colored(Color::Magenta, A_DIM);
   }
   return A_NORMAL;
 }
 
-// ---- Text into boxes ----
+// ---- Title ----
 
-/// Writes into one row of a box what fits from a column of it on. Returns the column behind.
-int put(const Box& box, int row, int column, std::wstring_view text, attr_t attributes = A_NORMAL) {
-  if (row >= box.rows || column >= box.columns) return column;
-  const std::wstring shown = clip(text, box.columns - column);
-  attr_set(attributes & ~static_cast<attr_t>(A_COLOR),
-           static_cast<short>(PAIR_NUMBER(static_cast<int>(attributes))), nullptr);
-  mvaddnwstr(box.top + row, box.left + column, shown.c_str(), static_cast<int>(shown.size()));
-  attr_set(A_NORMAL, 0, nullptr);
-  return column + width(shown);
+std::wstring volumeText(const Desktop& desktop) {
+  constexpr int kBarWidth = 20;
+  const auto filled = static_cast<std::size_t>((desktop.outputVolume * kBarWidth + 50) / 100);
+  const std::wstring bar = std::wstring(filled, L'█') + std::wstring(kBarWidth - filled, L'░');
+  return L"volume " + bar + L" " + std::to_wstring(desktop.outputVolume) +
+         (desktop.outputMuted ? L" muted" : L"");
 }
-
-/// The first row of a part: its name in a rule.
-void putHeading(const Box& box, std::wstring_view name) {
-  const int end = put(box, 0, 0, L"── " + std::wstring(name) + L" ", A_BOLD);
-  put(box, 0, end, std::wstring(static_cast<std::size_t>(std::max(0, box.columns - end)), L'─'), A_DIM);
-}
-
-// ---- The parts ----
 
 void paintTitle(const Box& box, const Desktop& desktop) {
-  constexpr int kBarWidth = 10;
-  const int filled = (desktop.outputVolume * kBarWidth + 50) / 100;
-  const std::wstring bar = std::wstring(static_cast<std::size_t>(filled), L'█') +
-                           std::wstring(static_cast<std::size_t>(kBarWidth - filled), L'░');
-  const std::wstring volume = L"volume " + bar + L" " + std::to_wstring(desktop.outputVolume) +
-                              (desktop.outputMuted ? L" muted" : L"");
-  const int volumeColumn = box.columns - width(volume) - 1;
-
+  const std::wstring volume = volumeText(desktop);
+  const int volumeColumn = std::max(0, box.columns - width(volume) - 1);
   Box left = box;
   left.columns = volumeColumn - 1;
-  int column = put(left, 0, 1, L"kvd", A_BOLD);
-  if (gScreenLocked) column = put(left, 0, column + 1, L"screen locked", colored(Red) | A_BOLD);
-  put(left, 0, column + 1, L"on the rehearsal desktop");
-  put(box, 0, volumeColumn, volume, desktop.outputMuted ? colored(Red) : colored(Yellow));
+  int column = put(left, 0, 1, L"kvd", A_BOLD) + 1;
+  const bool captured = std::ranges::any_of(desktop.displays, &stage::Display::captured);
+  if (gScreenLocked) column = put(left, 0, column, L"screen locked", colored(Color::Red) | A_BOLD) + 1;
+  if (captured) column = put(left, 0, column, L"display captured", colored(Color::Cyan) | A_BOLD) + 1;
+  if (!gScreenLocked && !captured) put(left, 0, column, L"on the rehearsal desktop");
+  put(box, 0, volumeColumn, volume, colored(desktop.outputMuted ? Color::Red : Color::Yellow));
 }
 
-struct Row {
-  const Application* application;
-  std::size_t number;
-};
-
-/// In the order of their digits; those that run first where there is no room for all.
-std::vector<Row> rowsOf(const Desktop& desktop, std::size_t room) {
-  std::vector<Row> rows;
-  for (const Application* const application : openable(desktop))
-    rows.push_back({application, rows.size() + 1});
-  if (rows.size() <= room) return rows;
-  std::stable_partition(rows.begin(), rows.end(), [](const Row& row) { return row.application->running(); });
-  return rows;
+void paintTarget(const Box& box, const LastTarget& target) {
+  const int column = put(box, 0, 1, L"last button → ");
+  put(box, 0, column, target.text(), A_BOLD);
 }
 
-/// What it does, or what it would be good for.
-std::wstring stateOf(const Application& application) {
-  if (!application.running()) return widen(roleOf(application));
-  const std::string doing = application.describe();
-  std::wstring state = doing.empty() ? L"runs" : widen(doing);
-  if (application.instances.size() > 1)
-    state += L" (×" + std::to_wstring(application.instances.size()) + L")";
-  return state;
-}
+// ---- Applications ----
 
-void paintApplication(const Box& box, int line, const Row& row, const Desktop& desktop) {
-  constexpr int kNameColumn = 5;
-  constexpr int kStateColumn = 21;
-  const Application& application = *row.application;
-  const bool inFront = desktop.front && desktop.front->application == &application;
-  const bool running = application.running();
-  if (row.number <= 9) put(box, line, 1, std::to_wstring(row.number), colored(Yellow));
-  if (running) put(box, line, 3, inFront ? L"»" : L"●", colored(Green));
+/// Returns the line behind the application's.
+int paintApplication(const Box& box, int line, const ApplicationRow& row) {
+  constexpr std::size_t kLastDigit = 9;
+  const bool runs = row.mark != Mark::None;
+  if (row.number <= kLastDigit)
+    put(box, line, kNumberColumn, std::to_wstring(row.number), colored(Color::Yellow));
+  if (runs)
+    put(box, line, kMarkColumn, row.mark == Mark::InFront ? L"»" : L"●", colored(Color::Green, A_BOLD));
   Box names = box;
-  names.columns = std::min(box.columns, kStateColumn - 1);
-  put(names, line, kNameColumn, widen(application.name), running ? A_BOLD : A_NORMAL);
-  put(box, line, kStateColumn, stateOf(application), running ? A_NORMAL : A_DIM);
+  names.columns = std::min(box.columns, kDetailsColumn - 1);
+  put(names, line, kNameColumn, row.name, runs ? A_BOLD : A_NORMAL);
+  put(box, line++, kDetailsColumn, row.details,
+      row.inTrouble ? colored(Color::Red, A_BOLD)
+      : runs        ? A_NORMAL
+                    : A_DIM);
+  for (const std::wstring& state : row.state) put(box, line++, kNameColumn, state, colored(Color::Green));
+  return line;
 }
 
-void paintApplications(const Box& box, const Desktop& desktop) {
+void paintApplications(const Box& box, std::vector<ApplicationRow> rows) {
   putHeading(box, L"Applications: ● runs, » in front");
-  const auto room = static_cast<std::size_t>(box.rows - 1);
-  const std::vector<Row> rows = rowsOf(desktop, room);
-  const std::size_t shown = rows.size() <= room ? rows.size() : room - 1;
-  for (std::size_t i = 0; i < shown; ++i) paintApplication(box, static_cast<int>(i) + 1, rows[i], desktop);
-  if (shown == rows.size()) return;
-  put(box, box.rows - 1, 3, L"… and " + std::to_wstring(rows.size() - shown) + L" more", A_DIM);
+  const std::size_t all = rows.size();
+  fit(rows, box.rows - 1);
+  if (rows.size() < all && !rows.empty()) rows.pop_back();
+  int line = 1;
+  for (const ApplicationRow& row : rows) line = paintApplication(box, line, row);
+  if (rows.size() < all)
+    put(box, line, kMarkColumn, L"… and " + std::to_wstring(all - rows.size()) + L" more", A_DIM);
 }
+
+// ---- Keys ----
+
+/// The columns of a key in its row, of the remote and of the others: where it begins, and what it does.
+struct KeyColumns {
+  int label;
+  int what;
+};
+constexpr KeyColumns kRemoteColumns[kKeysPerRow] = {{1, 7}, {14, 20}, {32, 36}};
+constexpr KeyColumns kOtherColumns[kKeysPerRow] = {{1, 6}, {17, 19}, {33, 35}};
 
 void paintRemote(const Box& box, const RemoteKey* held) {
   putHeading(box, L"Remote");
-  constexpr int kLabelColumns = 6;
-  constexpr int kCellColumns = 17;
   int cell = 0;
   for (const RemoteKey& key : remoteKeys()) {
     const int row = 1 + cell / kKeysPerRow;
-    const int column = cell % kKeysPerRow * kCellColumns;
-    put(box, row, column, key.label, colored(Yellow));
-    put(box, row, column + kLabelColumns, std::wstring(key.what) + (&key == held ? L"…" : L""),
-        &key == held ? A_REVERSE : A_NORMAL);
-    ++cell;
+    const auto& [label, what] = kRemoteColumns[cell++ % kKeysPerRow];
+    put(box, row, label, key.label, colored(Color::Yellow, A_BOLD));
+    put(box, row, what, key.what, &key == held ? A_REVERSE : A_NORMAL);
   }
 }
+
+void paintOtherKeys(const Box& box) {
+  putHeading(box, L"Desktop");
+  int cell = 0;
+  for (const OtherKey& key : otherKeys()) {
+    const int row = 1 + cell / kKeysPerRow;
+    const auto& [label, what] = kOtherColumns[cell++ % kKeysPerRow];
+    put(box, row, label, key.label, colored(Color::Yellow, A_BOLD));
+    put(box, row, what, key.what);
+  }
+}
+
+// ---- Journal ----
 
 void paintJournal(const Box& box, State& state) {
   Box rows = box;
   ++rows.top;
   --rows.rows;
-  const std::vector<Line> lines = state.journal.show(rows.rows, rows.columns - 1, state.scrolled);
+  const std::vector<Line> lines =
+      state.journal.show(rows.rows, rows.columns - 1, state.scrolled, state.wholeScripts);
   state.page = rows.rows - 1;
-  putHeading(box, state.scrolled > 0 ? L"What kvd asks and does (Page Down for the newest)"
-                                     : L"What kvd asks and does");
+  putHeading(box, state.scrolled > 0   ? L"Journal: PgDn for the newest"
+                  : state.wholeScripts ? L"Journal, scripts in full"
+                                       : L"What kvd asks and does");
   const int first = rows.rows - static_cast<int>(lines.size());
   for (std::size_t i = 0; i < lines.size(); ++i) {
     put(rows, first + static_cast<int>(i), 1, lines[i].text, attributesOf(lines[i].tone));
   }
 }
 
+// ---- The last lines ----
+
 void paintHint(const Box& box, const State& state, const Desktop& desktop) {
   std::wstring hint = widen(state.lessons.hint(desktop));
-  if (state.held != nullptr) {
+  if (state.showsHelp) {
+    hint = L"Any other key leaves this page.";
+  } else if (state.held != nullptr) {
     hint = L"You hold " + std::wstring(state.held->what) + L". Press " + std::wstring(state.held->label) +
-           L" to let it go.";
+           L" again to let it go.";
   }
   int row = 0;
   for (const std::wstring& line : wrap(hint, box.columns - 2, 0))
-    put(box, row++, 1, line, colored(Yellow) | A_BOLD);
+    put(box, row++, 1, line, colored(Color::Yellow) | A_BOLD);
 }
 
-/// What else the keyboard does, or what is being typed, with the cursor behind it.
+/// What else the keyboard does, as much as there is room for.
+std::wstring_view footerFor(int columns) {
+  constexpr std::wstring_view kFooters[] = {
+      L" 1-9 open/front  x close  e fail  0 no front  l lock  c capture  v version  s scripts  : command  "
+      L"? all keys  q quit",
+      L" 1-9 open/front  x close  l lock  s scripts  : command  ? all keys  q quit",
+      L" 1-9 open  : command  ? keys  q quit",
+  };
+  const auto* const footer =
+      std::ranges::find_if(kFooters, [&](std::wstring_view text) { return width(text) <= columns; });
+  return footer != std::end(kFooters) ? *footer : kFooters[std::size(kFooters) - 1];
+}
+
+/// The keys, or what is being typed, with the cursor behind it.
 void paintFooter(const Box& box, const State& state) {
-  constexpr std::wstring_view kKeys =
-      L" 1-9 open/front  x close  0 front nobody  l lock  : command  ? help  q quit";
-  constexpr std::wstring_view kFewerKeys = L" 1-9 open  : command  ? help  q quit";
   curs_set(state.commandLine ? 1 : 0);
   if (state.commandLine) {
     std::wstring_view typed = *state.commandLine;
     while (width(typed) > box.columns - 3) typed.remove_prefix(1);
     const int end = put(box, 0, 0, L" :" + std::wstring(typed));
     move(box.top, std::min(end, box.columns - 1));
-  } else if (state.closing) {
-    put(box, 0, 0, L" Close which one? Press its digit.", A_BOLD);
-  } else {
-    put(box, 0, 0, width(kKeys) <= box.columns ? kKeys : kFewerKeys, A_DIM);
+    return;
+  }
+  switch (state.pending) {
+    case Pending::Nothing:
+      put(box, 0, 0, footerFor(box.columns), A_DIM);
+      break;
+    case Pending::Close:
+      put(box, 0, 0, L" Close which one? Press its digit.", A_BOLD);
+      break;
+    case Pending::Fail:
+      put(box, 0, 0, L" Make which one fail, or obey again? Press its digit.", A_BOLD);
+      break;
   }
 }
+
+// ---- Other pages ----
 
 struct HelpLine {
   std::wstring_view key;
@@ -215,7 +230,7 @@ void paintHelp(const Box& box, State& state) {
   state.scrolled = std::clamp(state.scrolled, 0, std::max(0, static_cast<int>(lines.size()) - box.rows));
   int row = 0;
   for (auto line = lines.begin() + state.scrolled; line != lines.end() && row < box.rows; ++line, ++row) {
-    put(box, row, 1, line->key, colored(Yellow));
+    put(box, row, 1, line->key, colored(Color::Yellow, A_BOLD));
     put(box, row, 1 + line->column, line->text);
   }
 }
@@ -231,18 +246,26 @@ void paintTooSmall(const Box& box) {
   }
 }
 
-}  // namespace
-
-void preparePaint() {
-  if (has_colors() == FALSE) return;
-  start_color();
-  use_default_colors();
-  init_pair(Green, COLOR_GREEN, -1);
-  init_pair(Cyan, COLOR_CYAN, -1);
-  init_pair(Yellow, COLOR_YELLOW, -1);
-  init_pair(Red, COLOR_RED, -1);
-  init_pair(Magenta, COLOR_MAGENTA, -1);
+void paintDesktop(int rows, int columns, State& state, const Desktop& desktop) {
+  std::vector<ApplicationRow> applications = rowsOf(desktop, applicationColumns(columns));
+  // Two lines for each, whether it runs or not: what stands below does not jump.
+  const int lines = std::max(linesOf(applications), 2 * static_cast<int>(applications.size()));
+  const Layout layout = arrange(rows, columns, lines);
+  paintTitle(layout.title, desktop);
+  paintTarget(layout.target, state.target);
+  if (state.showsHelp) {
+    paintHelp({layout.applications.top, 0, layout.hint.top - layout.applications.top, columns}, state);
+  } else {
+    paintApplications(layout.applications, std::move(applications));
+    paintRemote(layout.remote, state.held);
+    paintOtherKeys(layout.otherKeys);
+    paintJournal(layout.journal, state);
+  }
+  paintHint(layout.hint, state, desktop);
+  paintFooter(layout.footer, state);
 }
+
+}  // namespace
 
 void paint(State& state, const Desktop& desktop) {
   int rows = 0;
@@ -251,21 +274,9 @@ void paint(State& state, const Desktop& desktop) {
   erase();
   if (rows < kFewestRows || columns < kFewestColumns) {
     paintTooSmall({0, 0, rows, columns});
-    refresh();
-    return;
-  }
-  const Layout layout = arrange(rows, columns, static_cast<int>(openable(desktop).size()),
-                                static_cast<int>(remoteKeys().size()));
-  paintTitle(layout.title, desktop);
-  if (state.showsHelp) {
-    paintHelp({1, 0, layout.hint.top - 1, columns}, state);
   } else {
-    paintApplications(layout.applications, desktop);
-    paintRemote(layout.remote, state.held);
-    paintJournal(layout.journal, state);
+    paintDesktop(rows, columns, state, desktop);
   }
-  paintHint(layout.hint, state, desktop);
-  paintFooter(layout.footer, state);
   refresh();
 }
 

@@ -6,9 +6,6 @@
 
 namespace live {
 
-/// Chooses the colours, once after the terminal was opened.
-void preparePaint();
-
 /// Draws everything anew; the terminal gets what differs from last time. Notes in the state how far there was
 /// to scroll.
 void paint(State& state, const stage::Desktop& desktop);

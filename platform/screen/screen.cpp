@@ -2,10 +2,12 @@
 
 #include <unistd.h>
 
+#include <algorithm>
 #include <limits>
 #include <memory>
 
 #include "platform/base/run_loop.h"
+#include "platform/screen/brush.h"
 #include "platform/screen/controls.h"
 #include "platform/screen/paint.h"
 #include "platform/screen/state.h"
@@ -53,33 +55,53 @@ void draw(State& state) {
   paint(state, stage::desktop());
 }
 
+bool somethingHangs() {
+  return std::ranges::any_of(stage::desktop().installed,
+                             [](const auto& application) { return application->hangsUntil > stage::now(); });
+}
+
 }  // namespace
 
 std::optional<int> play() {
   const std::unique_ptr<Terminal> terminal = Terminal::open();
   if (terminal == nullptr) return std::nullopt;
-  preparePaint();
+  chooseColors();
   State state;
-  const OnLoop signals(new Source(terminal->signals(), kSignalsOrder, [&] {
-    if (!terminal->obeySignals()) endRun();
-  }));
+  bool ends = false;
+  const auto obeySignals = [&] {
+    if (terminal->obeySignals()) return;
+    ends = true;
+    endRun();
+  };
+  const OnLoop signals(new Source(terminal->signals(), kSignalsOrder, obeySignals));
   bool tookKey = false;
   return stage::playLive({
-      .show = [&](const stage::JournalLine& line) { state.journal.add(line); },
+      .show =
+          [&](const stage::JournalLine& line) {
+            state.journal.add(line);
+            state.target.note(line);
+          },
       .input =
           [&] {
             if (!takeKey(*terminal, state) && terminal->hungUp()) endRun();
           },
+      .between = [&] { state.target.settle(); },
       .idle =
           [&] {
             // Of an Escape that began no key the rest was read already, which the descriptor does not tell.
             tookKey = takeKey(*terminal, state);
             draw(state);
           },
+      .asleep =
+          [&] {
+            obeySignals();
+            draw(state);
+            return !ends;
+          },
       .wakeUp = [&]() -> std::optional<stage::Nanoseconds> {
         if (tookKey) return stage::now();
-        // What plays moves its position.
-        if (stage::nextDesktopChange()) return stage::now() + stage::kSecond;
+        // What plays moves its position, what hangs counts down.
+        if (stage::nextDesktopChange() || somethingHangs()) return stage::now() + stage::kSecond;
         return std::nullopt;
       },
   });

@@ -6,19 +6,24 @@
 #include <sys/ioctl.h>
 #include <sys/signalfd.h>
 #include <term.h>
+#include <termios.h>
 #include <unistd.h>
 
 #include <csignal>
 #include <cstdio>
 #include <cstring>
 #include <cwctype>
+#include <initializer_list>
+
+#include "platform/screen/rescue.h"
 
 namespace live {
 
 namespace {
 
-/// How long, in milliseconds, the bytes of one key may take to follow an Escape.
-constexpr int kEscapeDelay = 25;
+/// How long, in milliseconds, the bytes of one key may take to follow an Escape: over a slow line they are
+/// apart.
+constexpr int kEscapeDelay = 100;
 
 /// Box drawing and arrows take UTF-8. A system that never chose a locale gets the one without a country; who
 /// chose another encoding keeps it.
@@ -29,10 +34,15 @@ void chooseLocale() {
   }
 }
 
+sigset_t setOf(std::initializer_list<int> signals) {
+  sigset_t set;
+  sigemptyset(&set);
+  for (const int signal : signals) sigaddset(&set, signal);
+  return set;
+}
+
 sigset_t terminalSignals() {
-  sigset_t signals;
-  sigemptyset(&signals);
-  for (const int signal : {SIGWINCH, SIGCONT, SIGHUP, SIGQUIT}) sigaddset(&signals, signal);
+  sigset_t signals = setOf({SIGWINCH, SIGCONT, SIGHUP, SIGQUIT});
   struct sigaction stop {};
   sigaction(SIGTSTP, nullptr, &stop);
   // Without job control the shell has it ignored, and nobody would continue what stopped.
@@ -79,11 +89,26 @@ Keypress keypressOf(wint_t character) {
   }
 }
 
+bool sameModes(const termios& one, const termios& other) {
+  return one.c_lflag == other.c_lflag && one.c_iflag == other.c_iflag && one.c_oflag == other.c_oflag;
+}
+
+/// Gives the terminal its own modes and screen back. One that has no other screen gets an empty last line, on
+/// which the shell goes on.
+void leaveScreen() {
+  move(LINES - 1, 0);
+  clrtoeol();
+  refresh();
+  endwin();
+}
+
 }  // namespace
 
 std::unique_ptr<Terminal> Terminal::open() {
   chooseLocale();
   set_escdelay(kEscapeDelay);
+  termios found{};
+  tcgetattr(STDIN_FILENO, &found);
   SCREEN* const opened = newterm(nullptr, stdout, stdin);
   if (opened == nullptr) return nullptr;
   const bool movesCursor = cursor_address != nullptr;
@@ -102,11 +127,14 @@ std::unique_ptr<Terminal> Terminal::open() {
   noecho();
   nodelay(stdscr, TRUE);
   keypad(stdscr, TRUE);
+  tcgetattr(STDIN_FILENO, &terminal->modes_);
+  rescueTerminal(found);
   return terminal;
 }
 
 Terminal::~Terminal() {
-  endwin();
+  leaveScreen();
+  leaveTerminal();
   close(signals_);
 }
 
@@ -158,12 +186,18 @@ void Terminal::takeSize() {
 
 /// Leaves the screen and stops as any program does; returns when somebody continues it.
 void Terminal::stop() {
-  endwin();
+  termios current{};
+  tcgetattr(STDIN_FILENO, &current);
+  const sigset_t writing = setOf({SIGTTOU});
+  sigprocmask(SIG_BLOCK, &writing, nullptr);
+  leaveScreen();
+  // Where a parent stopped first the shell may have the terminal already, in the modes of its own line.
+  if (!sameModes(current, modes_)) tcsetattr(STDIN_FILENO, TCSANOW, &current);
+  sigprocmask(SIG_UNBLOCK, &writing, nullptr);
+
   std::signal(SIGTSTP, SIG_DFL);
   raise(SIGTSTP);
-  sigset_t stopping;
-  sigemptyset(&stopping);
-  sigaddset(&stopping, SIGTSTP);
+  const sigset_t stopping = setOf({SIGTSTP});
   sigprocmask(SIG_UNBLOCK, &stopping, nullptr);
   sigprocmask(SIG_BLOCK, &stopping, nullptr);
   comeBack();

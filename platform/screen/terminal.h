@@ -1,6 +1,8 @@
 // The terminal while it is a screen: from opening it to leaving it as it was found.
 #pragma once
 
+#include <termios.h>
+
 #include <memory>
 #include <optional>
 
@@ -36,6 +38,8 @@ class Terminal {
   void comeBack();
 
   int signals_ = -1;
+  /// Of the terminal while it is the screen.
+  termios modes_{};
 };
 
 }  // namespace live

@@ -1,9 +1,13 @@
 #include "platform/stage/clock.h"
 
+#include <poll.h>
+#include <sys/signalfd.h>
 #include <time.h>
 
 #include <algorithm>
-#include <cerrno>
+#include <csignal>
+#include <initializer_list>
+#include <utility>
 
 namespace stage {
 
@@ -11,6 +15,49 @@ namespace {
 
 bool sVirtual = false;
 Nanoseconds sNow = kVirtualStart;
+
+std::function<bool()> sSleepListener;
+/// So long a sleep asks nobody.
+constexpr Nanoseconds kSlice = kSecond / 4;
+Slept sSlept;
+
+sigset_t setOf(std::initializer_list<int> signals) {
+  sigset_t set;
+  sigemptyset(&set);
+  for (const int signal : signals) sigaddset(&set, signal);
+  return set;
+}
+
+/// A descriptor that polls as readable while one of these signals is pending, being blocked. Nobody reads it:
+/// the run loop and the terminal take signals from descriptors of their own.
+int pendingSignals() {
+  static const int descriptor = [] {
+    const sigset_t awaited = setOf({SIGTERM, SIGINT, SIGHUP, SIGQUIT, SIGTSTP, SIGWINCH});
+    return signalfd(-1, &awaited, SFD_CLOEXEC | SFD_NONBLOCK);
+  }();
+  return descriptor;
+}
+
+bool askedToEnd() {
+  sigset_t pending;
+  if (sigpending(&pending) != 0) return false;
+  for (const int signal : {SIGTERM, SIGINT, SIGHUP, SIGQUIT}) {
+    if (sigismember(&pending, signal) == 1) return true;
+  }
+  return false;
+}
+
+void sleepInRealTime(Nanoseconds duration) {
+  const Nanoseconds end = now() + duration;
+  for (Nanoseconds left = duration; left > 0; left = end - now()) {
+    if (sSleepListener && !sSleepListener()) return;
+    if (askedToEnd()) return;
+    const Nanoseconds slice = std::min(left, kSlice);
+    const timespec time{slice / kSecond, slice % kSecond};
+    pollfd signals{pendingSignals(), POLLIN, 0};
+    ppoll(&signals, 1, &time, nullptr);
+  }
+}
 
 }  // namespace
 
@@ -29,9 +76,14 @@ void advanceTo(Nanoseconds time) { sNow = std::max(sNow, time); }
 
 void pass(Nanoseconds duration) {
   if (sVirtual) return advanceTo(sNow + duration);
-  timespec left{duration / kSecond, duration % kSecond};
-  while (nanosleep(&left, &left) == -1 && errno == EINTR) {
-  }
+  const Nanoseconds begin = now();
+  sleepInRealTime(duration);
+  sSlept.asked += duration;
+  sSlept.taken += now() - begin;
 }
+
+void setSleepListener(std::function<bool()> listener) { sSleepListener = std::move(listener); }
+
+Slept slept() { return sSlept; }
 
 }  // namespace stage

@@ -1,6 +1,8 @@
 // The rehearsal desktop's clock: virtual, or the machine's own.
 #pragma once
 
+#include <functional>
+
 #include "platform/base/run_loop.h"
 
 namespace stage {
@@ -20,7 +22,19 @@ bool timeIsVirtual();
 Nanoseconds now();
 /// Moves virtual time forward to `time`; never back, and not at all in real time.
 void advanceTo(Nanoseconds time);
-/// Lets so much time pass: at once in virtual time, by sleeping in real time.
+/// Lets so much time pass: at once in virtual time, by sleeping in real time; there a signal that asks the
+/// program to end cuts it short.
 void pass(Nanoseconds duration);
+
+/// In real time, called as each such sleep begins and several times a second while it lasts; false cuts it
+/// short.
+void setSleepListener(std::function<bool()> listener);
+
+/// How long all such sleeps were: as asked for, which is what they take in virtual time, and by the clock.
+struct Slept {
+  Nanoseconds asked = 0;
+  Nanoseconds taken = 0;
+};
+Slept slept();
 
 }  // namespace stage

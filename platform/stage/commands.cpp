@@ -9,6 +9,7 @@
 #include "platform/mach.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/director.h"
+#include "platform/stage/live.h"
 #include "platform/stage/report.h"
 #include "platform/stage/script_world.h"
 #include "platform/stage/spindle.h"
@@ -25,7 +26,7 @@ namespace {
 using remote::inQuotes;
 using remote::UsageError;
 
-/// The words behind a command's name, and the whole text behind it.
+/// The words behind a command's name, and the whole line.
 struct Words {
   std::vector<std::string> list;
   std::string_view text;
@@ -45,6 +46,8 @@ struct Command {
 };
 
 constexpr std::size_t kAnyNumber = static_cast<std::size_t>(-1);
+
+constexpr std::string_view kBlanks = " \t\r";
 
 // ---- Messages ----
 
@@ -81,7 +84,11 @@ void hold(const Words& words) {
   const remote::Button& held = remote::knownButton(words.at(0));
   const auto time = remote::parseTime(words.at(1));
   sendButton(held, remote::kPressed);
-  waitThen(time.count(), [&held] { sendButton(held, remote::kReleased); });
+  keep("press " + std::string(held.name));
+  waitThen(time.count(), [&held] {
+    sendButton(held, remote::kReleased);
+    keep("release " + std::string(held.name));
+  });
 }
 
 void raw(const Words& words) {
@@ -248,6 +255,8 @@ void start(const Words&) {}
 
 void serveOthers(const Words&) { serve(); }
 
+void save(const Words& words) { saveRehearsal(words.at(0)); }
+
 void alive(const Words&) { say("alive: " + aliveText()); }
 
 void help(const Words&);
@@ -279,6 +288,7 @@ constexpr Command kCommands[] = {
     {"wait", "TIME", "let time pass (2h, 10m, 1.5s, 20ms)", 1, 1, true, wait},
     {"start", "", "start the daemon, which else starts by itself", 0, 0, true, start},
     {"serve", "", "answer other processes until the daemon ends", 0, 0, true, serveOthers},
+    {"save", "FILE", "write what was done so far as a transcript", 1, 1, false, save},
     {"alive", "", "count the host objects that are alive", 0, 0, false, alive},
     {"help", "", "this list", 0, 0, false, help},
 };
@@ -292,6 +302,16 @@ void help(const Words&) {
   }
 }
 
+/// Those of which nothing is kept, or something else: what they do to time is kept by the clock.
+constexpr std::string_view kNotKept[] = {"hold", "wait", "serve", "save", "help"};
+
+/// Keeps a line without the blanks at its ends: one that begins with a blank is no command to a transcript.
+void keepLine(std::string_view line) {
+  const std::size_t begin = line.find_first_not_of(kBlanks);
+  if (begin == std::string_view::npos) return;
+  keep(std::string(line.substr(begin, line.find_last_not_of(kBlanks) + 1 - begin)));
+}
+
 const Command* findCommand(std::string_view name) {
   const auto* const found = std::find_if(std::begin(kCommands), std::end(kCommands),
                                          [&](const Command& command) { return command.name == name; });
@@ -300,7 +320,6 @@ const Command* findCommand(std::string_view name) {
 
 Words split(std::string_view line) {
   Words words;
-  constexpr std::string_view kBlanks = " \t\r";
   for (std::size_t start = line.find_first_not_of(kBlanks); start != std::string_view::npos;) {
     const std::size_t end = std::min(line.find_first_of(kBlanks, start), line.size());
     words.list.emplace_back(line.substr(start, end - start));
@@ -310,14 +329,17 @@ Words split(std::string_view line) {
 }
 
 bool isComment(std::string_view line) {
-  const std::size_t start = line.find_first_not_of(" \t\r");
+  const std::size_t start = line.find_first_not_of(kBlanks);
   return start == std::string_view::npos || line[start] == '#';
 }
 
 }  // namespace
 
 std::optional<std::string> runCommand(std::string_view line) {
-  if (isComment(line)) return std::nullopt;
+  if (isComment(line)) {
+    keepLine(line);
+    return std::nullopt;
+  }
   Words words = split(line);
   words.text = line;
   const std::string name = words.at(0);
@@ -329,6 +351,7 @@ std::optional<std::string> runCommand(std::string_view line) {
   }
   try {
     command->run(words);
+    if (std::ranges::find(kNotKept, command->name) == std::end(kNotKept)) keepLine(line);
     return std::nullopt;
   } catch (const UsageError& error) {
     return error.what();

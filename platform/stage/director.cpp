@@ -15,6 +15,8 @@ std::function<void()> sThen;
 
 bool sDaemonEnded = false;
 
+std::function<void(const std::string&)> sKeeper;
+
 }  // namespace
 
 void beginRehearsal(base::TimeSource time, std::function<void(const JournalLine&)> listener) {
@@ -50,6 +52,12 @@ void waitThen(Nanoseconds duration, std::function<void()> then) {
   if (sWaitEnd) finishWait();
   sWaitEnd = now() + duration;
   sThen = std::move(then);
+}
+
+void setKeeper(std::function<void(const std::string&)> keeper) { sKeeper = std::move(keeper); }
+
+void keep(const std::string& command) {
+  if (sKeeper) sKeeper(command);
 }
 
 bool daemonHasEnded() { return sDaemonEnded; }

@@ -24,6 +24,8 @@ int runDaemon();
 std::optional<Nanoseconds> waitEnd();
 /// Ends that wait and does what was to be done then.
 void finishWait();
+/// Where it goes what was done at the desktop, in the words of commands; nowhere when empty.
+void setKeeper(std::function<void(const std::string& command)> keeper);
 
 // ---- For commands ----
 
@@ -31,6 +33,8 @@ void finishWait();
 void waitThen(Nanoseconds duration, std::function<void()> then);
 /// Whether the daemon has run and ended.
 bool daemonHasEnded();
+/// Keeps what was done, where somebody keeps it.
+void keep(const std::string& command);
 /// Answers the person at the desktop.
 void say(const std::string& text);
 

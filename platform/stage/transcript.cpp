@@ -152,7 +152,7 @@ int playTranscript(int input, std::ostream& output) {
 }
 
 void serve() {
-  if (sReader == nullptr) return;
+  if (sReader == nullptr) return say("other processes are answered anyway");
   sServing = true;
   writeLines();
   const char* const directory = getenv("XDG_RUNTIME_DIR");
