@@ -29,7 +29,7 @@ class Controls : public testing::Test {
   std::wstring commands() {
     std::wstring all;
     int back = 0;
-    for (const live::Line& line : state_.journal.show(100, 200, back)) {
+    for (const live::Line& line : state_.journal.show(100, 200, back, false)) {
       if (line.tone == live::Tone::Command) all += line.text.substr(2) + L"; ";
     }
     return all;
@@ -48,19 +48,26 @@ TEST_F(Controls, DigitsOpenBringToTheFrontAndClose) {
       << "the name is the first's";
 }
 
-TEST_F(Controls, KeysTapButtonsAndHoldThoseThatScan) {
-  type(L" n");
+TEST_F(Controls, KeysTapButtonsAndHoldThoseThatAreHeld) {
+  type(L" n.m");
   press(Special::Left);
+  press(Special::Escape);
+  EXPECT_EQ(commands(), L"tap playpause; tap next; tap stop; tap app-menu; tap left; tap menu; ");
   type(L"ff");
   EXPECT_EQ(state_.held, nullptr);
-  type(L"f+");
-  EXPECT_EQ(state_.held, nullptr);
-  type(L"fr");
+  type(L"+p-r");
   EXPECT_EQ(state_.held->button, "rewind");
+  EXPECT_TRUE(commands().ends_with(
+      L"press forward; release forward; press volume-up; release volume-up; tap previous; press volume-down; "
+      L"release volume-down; press rewind; "));
+}
+
+TEST_F(Controls, KeysMakeThingsHarder) {
+  type(L"e1e1e1e9ccvvvl");
   EXPECT_EQ(
       commands(),
-      L"tap playpause; tap next; tap left; press forward; release forward; press forward; release forward; "
-      L"tap volume-up; press forward; release forward; press rewind; ");
+      L"answers Lyrabox errors; answers Lyrabox nothing; answers Lyrabox normally; capture 1 on; "
+      L"capture 1 off; version Snapvale 6.0.6; version Snapvale 7.1.5; version Snapvale 8.1.2; lock on; ");
 }
 
 TEST_F(Controls, TheCommandLineTakesEveryCharacterAsText) {
@@ -73,7 +80,11 @@ TEST_F(Controls, TheCommandLineTakesEveryCharacterAsText) {
   EXPECT_FALSE(stage::desktop().outputMuted);
   type(L":");
   press(Special::Up);
+  press(Special::Up);
   EXPECT_EQ(state_.commandLine, L"volume 7");
+  press(Special::Down);
+  EXPECT_EQ(state_.commandLine, L"");
+  press(Special::Up);
   for (int i = 0; i < 9; ++i) press(Special::Backspace);
   EXPECT_FALSE(state_.commandLine.has_value());
   type(L":");

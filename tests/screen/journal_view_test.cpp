@@ -17,15 +17,15 @@ JournalView viewOf(std::string_view letters) {
     if (letter >= 'A' && letter <= 'Z') {
       view.addCommand(std::string(1, letter));
     } else {
-      view.add({stage::Entry::Question, std::string(1, letter), 0, {}});
+      view.add({stage::Entry::Question, std::string(1, letter), 0, {}, {}});
     }
   }
   return view;
 }
 
-Lines shown(const JournalView& view, int rows, int back = 0) {
+Lines shown(const JournalView& view, int rows, int back = 0, bool wholeScripts = false) {
   Lines texts;
-  for (const live::Line& line : view.show(rows, 20, back)) texts.push_back(line.text);
+  for (const live::Line& line : view.show(rows, 20, back, wholeScripts)) texts.push_back(line.text);
   return texts;
 }
 
@@ -51,15 +51,22 @@ TEST(JournalView, DoesNotGrowWithWhatRepeatsNorWithoutEnd) {
   EXPECT_EQ(shown(viewOf(std::string(5000, 'T')), 5000).size(), 2000u);
 }
 
+TEST(JournalView, ShowsScriptsInFullOnDemand) {
+  JournalView view;
+  view.add({stage::Entry::Script, "script to A: b ⏎ c = 1", 0, "tell A\nb\nc\nend", "= 1"});
+  EXPECT_EQ(shown(view, 9, 0, true),
+            (Lines{L"  script to A:", L"    tell A", L"    b", L"    c", L"    end", L"    = 1"}));
+}
+
 TEST(JournalView, ScrollsBackNoFartherThanItsBeginning) {
   const JournalView view = viewOf("abcde");
   EXPECT_EQ(shown(view, 2), (Lines{L"  d", L"  e"}));
   EXPECT_EQ(shown(view, 2, 2), (Lines{L"  b", L"  c"}));
   int back = 99;
-  view.show(2, 20, back);
+  view.show(2, 20, back, false);
   EXPECT_EQ(back, 3);
   back = -1;
-  EXPECT_EQ(view.show(9, 20, back).size(), 5u);
+  EXPECT_EQ(view.show(9, 20, back, false).size(), 5u);
   EXPECT_EQ(back, 0);
 }
 

@@ -4,6 +4,8 @@
 
 #include <vector>
 
+#include "platform/screen/application_rows.h"
+
 namespace {
 
 using live::Box;
@@ -28,12 +30,12 @@ bool fit(const std::vector<Box>& boxes, int rows, int columns) {
 TEST(Layout, FitsEveryTerminalFromTheSmallestOn) {
   for (int rows = live::kFewestRows; rows < 50; ++rows) {
     for (int columns = live::kFewestColumns; columns < 120; columns += 3) {
-      for (const int applications : {1, 7, 40}) {
-        const live::Layout layout = live::arrange(rows, columns, applications, 14);
-        EXPECT_TRUE(fit(
-            {layout.title, layout.applications, layout.remote, layout.journal, layout.hint, layout.footer},
-            rows, columns))
-            << rows << "x" << columns << ", " << applications;
+      for (const int lines : {1, 14, 80}) {
+        const live::Layout layout = live::arrange(rows, columns, lines);
+        EXPECT_TRUE(fit({layout.title, layout.target, layout.applications, layout.remote, layout.otherKeys,
+                         layout.journal, layout.hint, layout.footer},
+                        rows, columns))
+            << rows << "x" << columns << ", " << lines;
         EXPECT_GE(layout.applications.rows, 2);
         EXPECT_GE(layout.journal.rows, 4);
       }
@@ -41,12 +43,32 @@ TEST(Layout, FitsEveryTerminalFromTheSmallestOn) {
   }
 }
 
-TEST(Layout, ShowsTheWholeRemoteOnAnUsualTerminal) {
-  for (const auto& [rows, columns] : {std::pair(24, 80), std::pair(24, 132), std::pair(30, 60)}) {
-    const live::Layout layout = live::arrange(rows, columns, 7, 14);
-    EXPECT_EQ(layout.remote.rows, 8);
-    EXPECT_EQ(layout.applications.rows, 8);
+TEST(Layout, ShowsTheWholeRemoteAndTheJournalAtTheSide) {
+  for (const auto& [rows, columns] : {std::pair(24, 80), std::pair(30, 100), std::pair(45, 140)}) {
+    const live::Layout layout = live::arrange(rows, columns, 14);
+    EXPECT_EQ(layout.remote.rows, 6);
+    EXPECT_GE(layout.applications.rows, 14);
+    EXPECT_EQ(layout.journal.top, layout.applications.top);
+    EXPECT_EQ(layout.otherKeys.rows, rows > 24 ? 5 : 0);
   }
+}
+
+TEST(ApplicationRows, GiveWayFromTheEndButTheOneInFrontLast) {
+  live::ApplicationRow running;
+  running.mark = live::Mark::Runs;
+  running.state = {L"plays", L"on"};
+  std::vector<live::ApplicationRow> rows(3, running);
+  rows[2].mark = live::Mark::InFront;
+  live::fit(rows, 6);
+  EXPECT_EQ(rows[1].state.size(), 1u);
+  EXPECT_EQ(rows[2].state.size(), 1u);
+  live::fit(rows, 5);
+  EXPECT_EQ(rows[1].details, L"plays");
+  EXPECT_EQ(rows[2].state.size(), 1u);
+  rows[0].mark = live::Mark::None;
+  live::fit(rows, 2);
+  EXPECT_EQ(rows[1].details, L"plays");
+  EXPECT_EQ(rows.size(), 2u);
 }
 
 }  // namespace

@@ -10,13 +10,15 @@ TEST(Lessons, GoOnWithWhatThePersonGotToSee) {
   const std::pair<std::string_view, std::string_view> steps[] = {
       {"", "Press 2 to open Spindle, the disc player."},
       {"open Lyrabox", "Press 1 again: Lyrabox comes to the front"},
-      {"front Lyrabox", "Press Space, which is Play/Pause"},
+      {"front Lyrabox", "Press Space, the remote's Play/Pause"},
       {"tell Lyrabox to play", "Press Space again to pause it."},
-      {"tell Lyrabox to pause", "Let it play again (Space), then 2, 2, Space: Spindle plays"},
-      {"open Spindle", "Spindle plays, the other stops."},
-      {"tell Spindle to play dvd", "Press + for louder."},
-      {"volume 51", "? lists the keys."},
-      {"close Lyrabox", "? lists the keys."},
+      {"tell Lyrabox to pause", "Space once more"},
+      {"tell Lyrabox to play", "Press 2 to open Spindle"},
+      {"open Spindle", "Press 2 again: Spindle comes to the front"},
+      {"front Spindle", "Press Space: this one plays"},
+      {"tell Spindle to play dvd", "Press +"},
+      {"volume 51", "? tells all."},
+      {"close Lyrabox", "? tells all."},
   };
   stage::useVirtualTime();
   stage::setUpDesktop();
