@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <ctime>
 #include <optional>
 #include <vector>
 
@@ -61,6 +62,15 @@ std::optional<Place> placeOf(xcb_keysym_t symbol) {
   return std::nullopt;
 }
 
+/// The X server's clock, in milliseconds. Programs that hold back keys that repeat too fast look at it, so
+/// that a key without a time would be the last one they take. The coarse clock is never ahead of the
+/// server's.
+xcb_timestamp_t serverTime() {
+  timespec time{};
+  clock_gettime(CLOCK_MONOTONIC_COARSE, &time);
+  return static_cast<xcb_timestamp_t>(time.tv_sec * 1000 + time.tv_nsec / 1'000'000);
+}
+
 }  // namespace
 
 bool sendKey(Window window, std::uint32_t keysym, bool down, std::uint16_t modifiers) {
@@ -72,7 +82,7 @@ bool sendKey(Window window, std::uint32_t keysym, bool down, std::uint16_t modif
   xcb_key_press_event_t event{};
   event.response_type = down ? XCB_KEY_PRESS : XCB_KEY_RELEASE;
   event.detail = place->key;
-  event.time = XCB_CURRENT_TIME;
+  event.time = serverTime();
   event.root = x::root();
   event.event = window;
   event.state = place->state | modifiers;
@@ -99,7 +109,7 @@ void activate(Window window) {
   message.window = window;
   message.type = x::atom(x::NetActiveWindow);
   message.data.data32[0] = kFromPager;
-  message.data.data32[1] = XCB_CURRENT_TIME;
+  message.data.data32[1] = serverTime();
   xcb_send_event(server, 0, x::root(),
                  XCB_EVENT_MASK_SUBSTRUCTURE_NOTIFY | XCB_EVENT_MASK_SUBSTRUCTURE_REDIRECT,
                  reinterpret_cast<const char*>(&message));

@@ -30,6 +30,7 @@ struct Area {
 /// The windows that say to be full screen and are not hidden.
 std::vector<Window> fullScreenOf(const std::vector<Window>& windows) {
   std::vector<xcb_get_property_cookie_t> cookies;
+  cookies.reserve(windows.size());
   for (const Window window : windows) cookies.push_back(askProperty(window, atom(x::NetWmState)));
   std::vector<Window> found;
   for (std::size_t i = 0; i < windows.size(); ++i) {

@@ -86,6 +86,7 @@ Client awaitIdentity(Window window, const IdentityCookies& cookies) {
 
 std::vector<Client> identify(xcb_connection_t* server, const std::vector<Window>& windows) {
   std::vector<IdentityCookies> cookies;
+  cookies.reserve(windows.size());
   for (const Window window : windows) cookies.push_back(askIdentity(server, window));
   std::vector<Client> clients;
   for (std::size_t i = 0; i < windows.size(); ++i) clients.push_back(awaitIdentity(windows[i], cookies[i]));

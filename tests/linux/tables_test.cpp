@@ -5,13 +5,13 @@
 #include <algorithm>
 #include <fstream>
 #include <iterator>
-#include <map>
 #include <string>
 #include <utility>
 #include <vector>
 
 #include "platform/linux/casting.h"
 #include "platform/linux/deeds.h"
+#include "platform/linux/own_words.h"
 #include "platform/scripting/keyhouse_dictionary.h"
 #include "platform/scripting/lyrabox_dictionary.h"
 #include "platform/scripting/movie_dictionaries.h"
@@ -101,17 +101,22 @@ std::string programTable() {
   return text;
 }
 
-std::string wordTable(const Chapter& chapter) {
-  std::map<Code, std::string> words;
+std::string nameOf(Code word, const Chapter& chapter) {
+  if (const char* const own = desktop::nameOfOwnWord(word)) return own;
   if (chapter.dictionary != nullptr) {
-    for (const auto& [code, text] : wordsOf(*chapter.dictionary)) words[code] = text;
+    for (const auto& [code, text] : wordsOf(*chapter.dictionary)) {
+      if (code == word) return "`" + text + "`";
+    }
   }
-  std::string text = std::string("### ") + chapter.title + "\n\n| word | on | what is done |\n|---|---|---|\n";
+  return "unknown word";
+}
+
+std::string wordTable(const Chapter& chapter) {
+  std::string text =
+      std::string("### ") + chapter.title + "\n\n| word | on | what is done |\n|---|---|---|\n";
   for (const Deed& deed : desktop::deeds()) {
     if (deed.role != chapter.role) continue;
-    const auto word = words.find(deed.word);
-    text += "| " + (word != words.end() ? "`" + word->second + "`" : std::string("keys")) + " | " +
-            nameOf(deed.program) + " | " + tell(deed) + " |\n";
+    text += "| " + nameOf(deed.word, chapter) + " | " + nameOf(deed.program) + " | " + tell(deed) + " |\n";
   }
   return text;
 }
@@ -142,12 +147,9 @@ TEST(Casting, GoesByBusNamesAndWindowClassesWithoutAnEntry) {
     const char* busName;
     Role role;
   } const players[] = {
-      {"strawberry", Role::Jukebox},
-      {"mpv.instance4711", Role::ClassicMovies},
-      {"vlc", Role::DiscPlayer},
-      {"io.github.celluloid_player.Celluloid.instance-1", Role::ModernMovies},
-      {"playerctld", Role::None},
-      {"firefox.instance_1_7", Role::None},
+      {"strawberry", Role::Jukebox}, {"mpv.instance4711", Role::ClassicMovies},
+      {"vlc", Role::DiscPlayer},     {"io.github.celluloid_player.Celluloid.instance-1", Role::ModernMovies},
+      {"playerctld", Role::None},    {"firefox.instance_1_7", Role::None},
       {"headset", Role::None},
   };
   for (const auto& player : players) {
@@ -164,7 +166,8 @@ TEST(Casting, IsDecidedByTheEntrysOwnKeyFirst) {
   ASSERT_EQ(std::system(("rm -rf '" + home + "' && mkdir -p '" + applications + "'").c_str()), 0);
   const auto write = [&](const char* id, const char* lines) {
     std::ofstream(applications + "/" + id + ".desktop")
-        << "[Desktop Entry]\nType=Application\nName=x\nExec=true %U --flag\n" << lines;
+        << "[Desktop Entry]\nType=Application\nName=x\nExec=true %U --flag\n"
+        << lines;
   };
   write("mpv", "X-Kvd-Application=com.tarn.Lyrabox\n");
   write("vlc", "X-Kvd-Application=none\n");
