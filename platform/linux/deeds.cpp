@@ -176,7 +176,7 @@ constexpr Deed kDeeds[] = {
     {Role::ProfessionalPhotos, "org.kde.digikam", words::kReturn, Means::Nothing, "the show has begun"},
     {Role::ProfessionalPhotos, "rawtherapee", words::kShiftS, Means::Key, "F11"},
     {Role::ProfessionalPhotos, "rawtherapee", words::kReturn, Means::Nothing, "it has no shows, only the full screen"},
-    {Role::ProfessionalPhotos, "rawtherapee", words::kSpace, Means::Nothing, "nothing to pause"},
+    {Role::ProfessionalPhotos, "rawtherapee", words::kSpace, Means::Nothing, "there is nothing to pause"},
     {Role::ProfessionalPhotos, "rawtherapee", words::kEscape, Means::Key, "F11"},
 };
 // clang-format on
