@@ -61,9 +61,7 @@ void mpvCommand(pid_t process, std::string_view command) {
 }
 
 bool showMpvText(pid_t process, std::string_view text) {
-  // "$>" keeps mpv from reading "${…}" in it.
-  return request(process, Json::array({"show-text", "$>" + std::string(text), kTextMilliseconds}),
-                 kQueryLimit);
+  return request(process, Json::array({"show-text", std::string(text), kTextMilliseconds}), kQueryLimit);
 }
 
 }  // namespace desktop
