@@ -1,0 +1,143 @@
+"""The programs that play roles, each with something to play, and what they tell of themselves."""
+import glob
+import json
+import socket
+
+from desktop import wait
+
+
+class Program:
+    """A program whose window comes to the front; started here unless without a command."""
+
+    def __init__(self, desktop, window_class, *command):
+        self.desktop, self.window_class, self.pressed = desktop, window_class, "its start"
+        if command:
+            self.process = desktop.start(*command)
+        wait(lambda: desktop.front() == window_class, f"{window_class} comes to the front")
+
+    def get(self, name):
+        """What a question of its own, or else one to the desktop, is answered with."""
+        return (getattr(self, name, None) or getattr(self.desktop, name))()
+
+    def become(self, **wanted):
+        """Waits until everything is as wanted, such as PlaybackStatus="Playing"."""
+        seen = {}
+
+        def same():
+            seen.update((name, self.get(name)) for name in wanted)
+            return seen == wanted
+        wait(same, lambda: f"{type(self).__name__} after {self.pressed} with {wanted}; it has {seen}")
+
+    def follow(self, *steps):
+        """Presses a button and waits for what becomes of it, step by step."""
+        for self.pressed, wanted in steps:
+            self.desktop.press(*self.pressed.split())
+            self.become(**wanted)
+
+    def end(self):
+        self.process.kill()
+        self.process.wait()
+        wait(lambda: self.desktop.front() != self.window_class, f"{self.window_class} leaves the front")
+
+
+class Player(Program):
+    """A program on the bus, whose properties there begin with a capital."""
+
+    def __init__(self, desktop, window_class, bus_name, *command):
+        self.bus_name = f"org.mpris.MediaPlayer2.{bus_name}"
+        super().__init__(desktop, window_class, *command)
+        wait(lambda: self.get("PlaybackStatus"), f"{bus_name} comes to the bus")
+
+    def ask(self, verb, *words):
+        """What busctl says; nothing when the player does not answer."""
+        told = self.desktop.read("busctl", "--user", "--json=short", "--timeout=2", verb, self.bus_name,
+                                 "/org/mpris/MediaPlayer2", "org.mpris.MediaPlayer2.Player", *words)
+        return json.loads(told)["data"] if told else None
+
+    def get(self, name):
+        return self.ask("get-property", name) if name[0].isupper() else super().get(name)
+
+    def title(self):
+        return (self.get("Metadata") or {}).get("xesam:title", {}).get("data")
+
+    def position(self):
+        """Seconds."""
+        return (self.get("Position") or 0) / 1e6
+
+    def under_way(self):
+        """Some players lose what they are told while they load."""
+        return self.position() > 0.1
+
+
+class Strawberry(Player):
+    def __init__(self, desktop):
+        tracks = sorted(glob.glob(f"{desktop.media}/music/*"))
+        super().__init__(desktop, "strawberry", "strawberry", "strawberry", *tracks)
+        self.become(CanGoNext=True)
+
+
+class Mpv(Player):
+    def __init__(self, desktop, *options):
+        self.channel = f"{desktop.runtime}/mpv"
+        super().__init__(desktop, "mpv", "mpv", "mpv", "--vo=x11", f"--input-ipc-server={self.channel}",
+                         *options, f"{desktop.media}/film.mkv")
+
+    def get(self, name):
+        """Properties of mpv's own are those that nobody else has."""
+        if name[0].isupper() or hasattr(self, name) or hasattr(self.desktop, name):
+            return super().get(name)
+        with socket.socket(socket.AF_UNIX) as channel:
+            channel.settimeout(2)
+            channel.connect(self.channel)
+            channel.sendall(json.dumps({"command": ["get_property", name]}).encode() + b"\n")
+            answers = (json.loads(line) for line in channel.makefile())
+            return next(answer.get("data") for answer in answers if "error" in answer)
+
+
+class Celluloid(Player):
+    def __init__(self, desktop):
+        name = "io.github.celluloid_player.Celluloid"
+        super().__init__(desktop, name.lower(), name + ".instance-1", "celluloid")
+        # Given the film when it is started, it sometimes leaves it paused.
+        self.ask("call", "OpenUri", "s", f"file://{desktop.media}/film.mkv")
+        self.become(PlaybackStatus="Playing", under_way=True)
+
+
+class Vlc(Player):
+    """Shows blue while the disc's menu does, red in title 1, green in title 2."""
+
+    def __init__(self, desktop):
+        super().__init__(desktop, "vlc", "vlc", "vlc", "--no-qt-privacy-ask", "--no-metadata-network-access",
+                         "--vout=xcb_x11", "--extraintf=oldrc", f"--rc-unix={desktop.runtime}/vlc",
+                         "--rc-fake-tty", f"dvd://{desktop.media}/disc.iso")
+        self.become(colour=3)
+
+
+class Show(Program):
+    """Shows the first slide or photo from the start."""
+
+    def __init__(self, desktop, window_class, *command):
+        super().__init__(desktop, window_class, *command)
+        self.become(colour=1)
+
+
+class Impress(Show):
+    def __init__(self, desktop):
+        super().__init__(desktop, "libreoffice-impress", "soffice", "--norestore", "--nologo",
+                         "--nofirststartwizard", "--impress", f"{desktop.media}/slides.fodp")
+
+    def become(self, **wanted):
+        """While it still draws it loses keys."""
+        super().become(**wanted, settled=True)
+
+
+class Evince(Show):
+    def __init__(self, desktop):
+        super().__init__(desktop, "evince", "evince", f"{desktop.media}/slides.pdf")
+
+
+class Eog(Show):
+    def __init__(self, desktop):
+        # The show goes on by itself only after every scene's end.
+        desktop.write(".config/glib-2.0/settings/keyfile", "[org/gnome/eog/fullscreen]\nseconds=600\n")
+        super().__init__(desktop, "eog", "eog", f"{desktop.media}/photos/1.png")

@@ -1,0 +1,39 @@
+"""The volume: of the desktop, and of a player when the desktop's is at its top."""
+from desktop import stays, wait
+from programs import Mpv, Strawberry
+
+
+def held_volume_goes_on_until_release(desktop):
+    desktop.start_kvd()
+    for button, start, reached in (("volume-up", 20, lambda: desktop.volume() >= 40),
+                                   ("down", 80, lambda: desktop.volume() <= 60)):
+        desktop.volume(start)
+        desktop.press(button, "--press")
+        wait(reached, f"{button} is repeated")
+        desktop.press(button, "--release")
+        now = desktop.volume()
+        stays(lambda: desktop.volume() == now, "the volume stands still after the release")
+
+
+def volume_goes_by_five_within_its_limits(desktop):
+    desktop.start_kvd()
+    for button, start, end in (("volume-up", 50, 55), ("volume-down", 50, 45), ("up", 98, 100), ("down", 3, 0)):
+        desktop.volume(start)
+        desktop.press(button)
+        wait(lambda: desktop.volume() == end, f"{button} leads from {start} to {end}")
+    desktop.read("pactl", "set-sink-mute", "@DEFAULT_SINK@", "1")
+    desktop.press("volume-up")
+    wait(lambda: not desktop.muted() and desktop.volume() == 5, "volume up unmutes")
+
+
+def full_volume_raises_the_players_own(desktop):
+    desktop.start_kvd()
+    desktop.volume(100)
+    music = Strawberry(desktop)
+    music.ask("set-property", "Volume", "d", "0.5")
+    music.follow(("volume-up", {"Volume": 0.52, "volume": 100}))
+    film = Mpv(desktop, "--volume=50")
+    desktop.read("pactl", "set-sink-mute", "@DEFAULT_SINK@", "1")
+    film.follow(("volume-up", {"Volume": 0.5625, "volume": 100, "muted": False}), ("volume-down", {"volume": 95}))
+    film.become(Volume=0.5625)
+    music.become(Volume=0.52)
