@@ -18,7 +18,7 @@ has_debian_names() (
 )
 
 is_installed() {
-  local package=$1
+  local package=$1 program
   if has_debian_names; then
     [[ "$(dpkg-query -W -f='${db:Status-Status}' "$package" 2>/dev/null)" == installed ]]
     return
@@ -30,7 +30,15 @@ is_installed() {
         [[ -e /usr/local/include/gtest/gtest.h ]]
       ;;
     libncurses-dev) [[ -e /usr/include/ncurses.h || -e /usr/include/curses.h ]] ;;
-    *) command -v "$package" >/dev/null ;;
+    libsystemd-dev) pkg-config --exists libsystemd ;;
+    libxcb*-dev) pkg-config --exists xcb xcb-ewmh xcb-icccm xcb-keysyms xcb-randr xcb-res ;;
+    libpulse-dev) pkg-config --exists libpulse ;;
+    libglib2.0-dev) pkg-config --exists gio-unix-2.0 ;;
+    nlohmann-json3-dev) pkg-config --exists nlohmann_json ;;
+    *)
+      program=$(sed -n "s/^$package //p" tests/desktop/packages)
+      command -v "${program:-$package}" >/dev/null || [[ -e "${program:-$package}" ]]
+      ;;
   esac
 }
 
