@@ -1,0 +1,84 @@
+// latency_sender NAME: sends one press of Play/Pause for each line of its standard input, and writes the time
+// at which it set out, in nanoseconds on CLOCK_MONOTONIC. The line tells how: "call" calls the player NAME
+// over a connection to the session bus that is open, "button" sends to kvd's port, which is open too, and any
+// other line is a program and its arguments, separated by tabs, which is started and waited for.
+#include <spawn.h>
+#include <sys/wait.h>
+#include <systemd/sd-bus.h>
+#include <unistd.h>
+
+#include <cinttypes>
+#include <cstdint>
+#include <cstdio>
+#include <ctime>
+#include <iostream>
+#include <sstream>
+#include <string>
+#include <vector>
+
+#include "platform/mach.h"
+#include "remote/kvd_client.h"
+#include "remote/kvd_messages.h"
+
+namespace {
+
+bool call(sd_bus* bus, const char* player) {
+  sd_bus_message* message = nullptr;
+  const bool sent = sd_bus_message_new_method_call(bus, &message, player, "/org/mpris/MediaPlayer2",
+                                                   "org.mpris.MediaPlayer2.Player", "PlayPause") >= 0 &&
+                    sd_bus_message_set_expect_reply(message, 0) >= 0 &&
+                    sd_bus_send(bus, message, nullptr) >= 0;
+  sd_bus_message_unref(message);
+  return sent;
+}
+
+bool press(mach_port_t port) {
+  constexpr std::uint16_t kConsumerPage = 0x0C;
+  constexpr std::uint16_t kPlayPause = 0xCD;
+  return kvd_handlehidevent(port, kConsumerPage, kPlayPause, 0, 1) == MACH_MSG_SUCCESS;
+}
+
+bool run(const std::string& line) {
+  std::vector<std::string> words;
+  std::istringstream stream(line);
+  for (std::string word; std::getline(stream, word, '\t');) words.push_back(word);
+  std::vector<char*> arguments;
+  for (std::string& word : words) arguments.push_back(word.data());
+  arguments.push_back(nullptr);
+  pid_t child = 0;
+  int status = 0;
+  return posix_spawnp(&child, arguments[0], nullptr, nullptr, arguments.data(), environ) == 0 &&
+         waitpid(child, &status, 0) == child && status == 0;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+  if (argc != 2) {
+    std::fputs("Usage: latency_sender NAME\n", stderr);
+    return 2;
+  }
+  const std::string player = std::string("org.mpris.MediaPlayer2.") + argv[1];
+  sd_bus* bus = nullptr;
+  const char* unique = nullptr;
+  mach_port_t bootstrap = MACH_PORT_NULL;
+  mach_port_t port = MACH_PORT_NULL;
+  // A connection is open, and sends at once, when it knows its name.
+  if (sd_bus_open_user(&bus) < 0 || sd_bus_get_unique_name(bus, &unique) < 0 ||
+      task_get_special_port(mach_task_self(), TASK_BOOTSTRAP_PORT, &bootstrap) != KERN_SUCCESS ||
+      bootstrap_look_up(bootstrap, kKVDServiceName, &port) != KERN_SUCCESS) {
+    std::fputs("latency_sender: no session bus, or nobody is behind kvd's port\n", stderr);
+    return 1;
+  }
+  for (std::string line; std::getline(std::cin, line);) {
+    timespec start = {};
+    clock_gettime(CLOCK_MONOTONIC, &start);
+    const bool sent = line == "call" ? call(bus, player.c_str()) : line == "button" ? press(port) : run(line);
+    if (!sent) {
+      std::fprintf(stderr, "latency_sender: could not send by %s\n", line.c_str());
+      return 1;
+    }
+    std::printf("%" PRId64 "\n", std::int64_t{start.tv_sec} * 1'000'000'000 + start.tv_nsec);
+    std::fflush(stdout);
+  }
+}
