@@ -203,7 +203,13 @@ void play(Player& player) {
 }
 
 void pause(Player& player) {
-  if (statusOf(player) == PlaybackStatus::Playing) bringTo(player, PlaybackStatus::Paused, "Pause");
+  if (statusOf(player) != PlaybackStatus::Playing) return;
+  believe(player, PlaybackStatus::Paused);
+  // Not waited for: the player that is about to start shall not be held up by those that make room for it.
+  if (!send(player.callee, {mpris::kPath, mpris::kPlayerInterface, "Pause"}, "")) {
+    player.wish.reset();
+    refuse("the player cannot be reached");
+  }
 }
 
 void stop(Player& player) {
