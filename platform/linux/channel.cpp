@@ -57,7 +57,7 @@ std::string channelPath(pid_t process, std::string_view executable) {
 }
 
 Channel::Channel(pid_t process, std::string_view executable, Microseconds limit)
-    : process_(process), deadline_(HostAbsoluteTime() + static_cast<double>(limit) / 1e6) {
+    : deadline_(HostAbsoluteTime() + static_cast<double>(limit) / 1e6) {
   if (timedOutThisTurn(process)) return;
   socket_ = connectTo(channelPath(process, executable), process);
   if (socket_ >= 0) return;
@@ -73,7 +73,7 @@ bool Channel::waitFor(short events) {
   pollfd watched{socket_, events, 0};
   const double left = deadline_ - HostAbsoluteTime();
   const int ready = left > 0 ? poll(&watched, 1, static_cast<int>(left * 1e3) + 1) : 0;
-  if (ready == 0) noteTimeout(process_);
+  timedOut_ = ready == 0;
   return ready > 0 || (ready < 0 && errno == EINTR);
 }
 

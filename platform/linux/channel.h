@@ -29,16 +29,18 @@ class Channel {
   bool isOpen() const { return socket_ >= 0; }
   /// Sends a text whole; false when it does not get through.
   bool write(std::string_view text);
-  /// The next line that comes, without its end; nothing at the end and when the time is up, which is noted.
+  /// The next line that comes, without its end; nothing at the end and when the time is up.
   std::optional<std::string> readLine();
+  /// Whether the time was up before everything was sent and read.
+  bool timedOut() const { return timedOut_; }
 
  private:
   bool waitFor(short events);
 
-  const pid_t process_;
   /// On the clock of HostAbsoluteTime.
   const double deadline_;
   int socket_ = -1;
+  bool timedOut_ = false;
   std::string received_;
 };
 

@@ -43,6 +43,7 @@ bool request(pid_t process, Json command, Microseconds limit) {
     if (!answer.is_object() || !answer.contains("request_id") || answer["request_id"] != kRequest) continue;
     return answer.contains("error") && answer["error"] == "success";
   }
+  if (channel.timedOut()) noteTimeout(process);
   return false;
 }
 

@@ -2,6 +2,7 @@
 
 #include <charconv>
 
+#include "platform/base/run_loop.h"
 #include "platform/linux/channel.h"
 #include "platform/tarnscript/tarnscript.h"
 
@@ -16,6 +17,10 @@ struct Told {
   pid_t process = 0;
   std::optional<VlcPlace> place;
 };
+
+/// The turn of the loop in which it was last found busy with another client. That VLC itself hangs would
+/// have shown on the bus.
+std::optional<std::uint64_t> sBusy;
 
 /// Finds "2/3" in a line, whatever the words around it and their language.
 std::optional<VlcPlace> placeIn(std::string_view line) {
@@ -36,6 +41,7 @@ std::optional<VlcPlace> placeIn(std::string_view line) {
 /// Asks a question that is one word. Its answer ends with a line that begins with that word; what has
 /// happened to VLC meanwhile stands in lines between.
 std::optional<VlcPlace> ask(pid_t process, const std::string& question) {
+  if (sBusy == base::turn()) return std::nullopt;
   Channel channel(process, kExecutable, kQueryLimit);
   if (!channel.isOpen() || !channel.write(question + "\n")) return std::nullopt;
   std::optional<VlcPlace> place;
@@ -44,6 +50,7 @@ std::optional<VlcPlace> ask(pid_t process, const std::string& question) {
     if (line->starts_with("status change:")) continue;
     if (const auto found = placeIn(*line)) place = found;
   }
+  if (channel.timedOut()) sBusy = base::turn();
   return std::nullopt;
 }
 
