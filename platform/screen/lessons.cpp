@@ -57,7 +57,7 @@ std::string wayTo(const Desktop& desktop, const Application* player, const std::
   if (!player->running())
     return "Press " + key + " to open " + player->name + ", the " + std::string(roleOf(*player)) + ".";
   if (!desktop.front || desktop.front->application != player)
-    return "Press " + key + " again: " + player->name + " comes to the front, where the buttons go first.";
+    return "Press " + key + " again: " + player->name + " comes to the front, where buttons go first.";
   return inTheEnd;
 }
 
@@ -101,7 +101,7 @@ std::string Lessons::hint(const Desktop& desktop) const {
     case Volume:
       return "Press +: the volume goes up, and on while the button is held.";
     default:
-      return "Try other applications, e to make one fail, 0 for nobody in front; ? tells all.";
+      return "Try other applications; e makes one fail, 0 leaves none in front; ? tells all.";
   }
 }
 

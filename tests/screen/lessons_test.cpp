@@ -26,6 +26,7 @@ TEST(Lessons, GoOnWithWhatThePersonGotToSee) {
   for (const auto& [command, hint] : steps) {
     ASSERT_TRUE(stage::performCommand(std::string(command))) << command;
     lessons.observe(stage::desktop());
+    EXPECT_LE(lessons.hint(stage::desktop()).size(), 78u) << "80 columns, one at each end";
     EXPECT_NE(lessons.hint(stage::desktop()).find(hint), std::string::npos) << lessons.hint(stage::desktop());
   }
 }
