@@ -20,7 +20,8 @@ namespace spindle = scripting::spindle;
 // A row's program is its desktop entry; every other program of the role where there is none.
 constexpr const char* kOthers = nullptr;
 
-// clang-format off: one row a line, to be read beside the users' table.
+// One row a line, to be read beside the users' table.
+// clang-format off
 constexpr Deed kDeeds[] = {
     // Music players.
     {Role::Jukebox, kOthers, lyrabox::kPlayerState, Means::Code, "PlaybackStatus, or the direction of a scan"},
