@@ -15,6 +15,11 @@ import time
 
 GROUPS = "/sys/fs/cgroup"
 
+# The bus as desktops run it: the service manager joins it, and starts programs for those that ask.
+UNITS = {"dbus.socket": "[Socket]\nListenStream=%t/bus\n",
+         "dbus.service": "[Service]\nExecStart=dbus-daemon --session --address=systemd: --nofork --nopidfile\n"}
+JUKEBOX = "[Desktop Entry]\nType=Application\nName=Jukebox\nExec=sleep 1000\nX-Kvd-Application=com.tarn.Lyrabox\n"
+
 
 class Failed(Exception):
     """Something expected did not come about."""
@@ -50,13 +55,22 @@ class Session:
         self.programs = os.path.join(self.home, ".local/bin")
         # The leak checker of a sanitized build traces its process, which the service's confinement forbids.
         self.env = {"HOME": self.home, "XDG_RUNTIME_DIR": self.runtime, "PATH": self.programs + ":/usr/bin:/bin",
-                    "DBUS_SESSION_BUS_ADDRESS": f"unix:path={self.runtime}/session", "ASAN_OPTIONS": "detect_leaks=0"}
+                    "DBUS_SESSION_BUS_ADDRESS": f"unix:path={self.runtime}/bus", "ASAN_OPTIONS": "detect_leaks=0"}
         subprocess.run(["cmake", "--install", build, "--prefix", os.path.join(self.home, ".local")],
                        check=True, stdout=subprocess.DEVNULL)
         os.mkdir(self.runtime, 0o700)
+        for name, text in UNITS.items():
+            self.write(f".config/systemd/user/{name}", text)
+        self.write(".local/share/applications/jukebox.desktop", JUKEBOX)
+        self.write(".config/mimeapps.list", "[Default Applications]\naudio/mpeg=jukebox.desktop\n")
         for directory, _, files in os.walk(self.home):
             for name in ["", *files]:
                 os.chown(os.path.join(directory, name), self.user.pw_uid, self.user.pw_gid)
+
+    def write(self, path, text):
+        path = os.path.join(self.home, path)
+        os.makedirs(os.path.dirname(path), exist_ok=True)
+        write(path, text)
 
     def __enter__(self):
         return self
@@ -73,13 +87,13 @@ class Session:
             os.mkdir(os.path.join(self.group, name))
         for name in ["", "cgroup.procs", "cgroup.subtree_control", "cgroup.threads"]:
             os.chown(os.path.join(self.group, "user", name), self.user.pw_uid, self.user.pw_gid)
-        self.start("dbus-daemon", "--session", "--nofork", "--nopidfile",
-                   "--address=" + self.env["DBUS_SESSION_BUS_ADDRESS"])
         self.start("pulseaudio", "-n", "--daemonize=no", "--exit-idle-time=-1", "--use-pid-file=0",
                    "-L", "module-null-sink", "-L", "module-native-protocol-unix auth-anonymous=1")
-        wait(lambda: os.path.exists(self.runtime + "/session") and self.volume(), "a bus and a sound server")
+        wait(self.volume, "a sound server")
         self.start("/lib/systemd/systemd", "--user", "--unit=basic.target")
         wait(lambda: self.systemctl("is-active", "basic.target") == "active", "a service manager")
+        self.systemctl("start", "dbus.socket", "dbus.service")
+        wait(lambda: "org.freedesktop.systemd1" in self.run("busctl", "--user", "--acquired"), "it is on the bus")
 
     def __exit__(self, *_):
         if os.path.exists(self.group):
@@ -114,6 +128,9 @@ class Session:
         """Of the sound server, in percent."""
         return self.run("pactl", "get-sink-volume", "@DEFAULT_SINK@").partition("/")[2].partition("/")[0].strip()
 
+    def jukeboxes(self):
+        return self.systemctl("list-units", "--plain", "--no-legend", "app-kvd-jukebox-*").splitlines()
+
 
 def play(session):
     session.set_up()
@@ -129,10 +146,21 @@ def play(session):
     status = read(f"/proc/{first}/status")
     assert "NoNewPrivs:\t1" in status and "Seccomp:\t2" in status, status
 
+    print("a player that it starts is not its child, is started once, and outlives it")
+    session.run("kvremote", "play")
+    wait(session.jukeboxes, "a music player was started")
+    session.run("kvremote", "play")
+    session.run("kvremote", "volume-down")
+    wait(lambda: session.volume() == "90%", "the second press is over")
+    assert session.run("pgrep", "-P", first) == ""
+    session.run("kvremote", "volume-up")
+    wait(lambda: session.volume() == "95%", "the volume is back")
+
     print("it ends when told to, and the next button starts it again")
     session.run("kvremote", "quit")
     wait(lambda: session.show("kvd.service", "ActiveState") == "inactive", "kvd ended")
     assert session.show("kvd.service", "Result") == "success"
+    assert len(session.jukeboxes()) == 1
     session.run("kvremote", "volume-down")
     wait(lambda: session.volume() == "90%", "the volume went down again")
     assert session.show("kvd.service", "MainPID") not in ("0", first)
@@ -149,7 +177,7 @@ def play(session):
 
 
 def main():
-    missing = [name for name in ("cmake", "dbus-daemon", "pactl", "pulseaudio", "systemctl", "unshare")
+    missing = [name for name in ("busctl", "cmake", "dbus-daemon", "pactl", "pulseaudio", "systemctl", "unshare")
                if shutil.which(name) is None]
     if missing or os.geteuid() != 0:
         print("skipped: " + (f"not installed: {', '.join(missing)}" if missing else "it takes root"))
