@@ -14,11 +14,9 @@ Casting decide(const Entry* entry, const Program* program, bool bystander) {
   } else if (program != nullptr) {
     casting.entry = program->entry;
   }
-  if (entry != nullptr && entry->cast) {
-    casting.role = entry->role;
-  } else if (bystander) {
-    casting.role = Role::None;
-  } else if (program != nullptr) {
+  const bool castByPerson = entry != nullptr && entry->cast;
+  if (bystander && !castByPerson) return casting;
+  if (program != nullptr && !castByPerson) {
     casting.role = program->role;
   } else if (entry != nullptr) {
     casting.role = entry->role;

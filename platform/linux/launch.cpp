@@ -78,9 +78,9 @@ std::vector<std::string> sessionEnvironment() {
 }
 
 std::vector<char*> pointers(const std::vector<std::string>& texts) {
-  std::vector<char*> result;
-  for (const std::string& text : texts) result.push_back(const_cast<char*>(text.c_str()));
-  result.push_back(nullptr);
+  std::vector<char*> result(texts.size() + 1, nullptr);
+  std::transform(texts.begin(), texts.end(), result.begin(),
+                 [](const std::string& text) { return const_cast<char*>(text.c_str()); });
   return result;
 }
 

@@ -1,13 +1,15 @@
 #include "platform/linux/running.h"
 
 #include <algorithm>
-#include <cstdio>
 #include <fstream>
+#include <functional>
 #include <iterator>
 #include <sstream>
+#include <string_view>
 
 #include "platform/linux/casting.h"
 #include "platform/tarnscript/tarnscript.h"
+#include "platform/tarnscript/text.h"
 
 namespace desktop {
 
@@ -89,15 +91,29 @@ void addPrograms(std::vector<Instance>& found) {
   }
 }
 
+/// An office shows the documents of all its programs from one process: letters and sheets are not slides.
+bool showsOtherDocument(const Client& client, const Instance& instance) {
+  constexpr std::string_view kOffice = "libreoffice-";
+  return instance.program != nullptr && client.className.starts_with(kOffice) &&
+         !tarnscript::equalIgnoringCase(client.className, instance.program->windowClass);
+}
+
+/// What tells a program apart whose process nobody knows.
+std::uint32_t numberWithoutProcess(const Instance& instance) {
+  if (!instance.windows.empty()) return instance.windows.front();
+  return static_cast<std::uint32_t>(std::hash<std::string>()(instance.owner));
+}
+
 void addWindows(std::vector<Instance>& found) {
   for (Instance& instance : found) {
     for (const Client& client : clients()) {
-      if (belongsTo(client, instance)) instance.windows.push_back(client.window);
+      if (belongsTo(client, instance) && !showsOtherDocument(client, instance)) {
+        instance.windows.push_back(client.window);
+      }
     }
     instance.serialNumber.low = static_cast<std::uint32_t>(instance.process);
-    // A window whose process nobody knows is told apart by its own number.
     instance.serialNumber.high =
-        instance.process != 0 ? startTime(instance.process) : instance.windows.front();
+        instance.process != 0 ? startTime(instance.process) : numberWithoutProcess(instance);
   }
 }
 
@@ -163,8 +179,8 @@ std::vector<const Instance*> instancesOf(Role role) {
       return a.started > b.started;
     });
   }
-  std::vector<const Instance*> ordered;
-  for (const Rank& rank : ranks) ordered.push_back(rank.instance);
+  std::vector<const Instance*> ordered(ranks.size());
+  std::transform(ranks.begin(), ranks.end(), ordered.begin(), [](const Rank& rank) { return rank.instance; });
   return ordered;
 }
 
