@@ -170,8 +170,8 @@ std::vector<const Instance*> instancesOf(Role role) {
   // Who plays may have to be asked for: only where there is something to choose.
   if (ranks.size() > 1) {
     for (Rank& rank : ranks) {
-      rank.inFront = rank.instance == frontInstance();
       rank.plays = plays(*rank.instance);
+      rank.inFront = rank.instance == frontInstance();
     }
     std::stable_sort(ranks.begin(), ranks.end(), [](const Rank& a, const Rank& b) {
       if (a.inFront != b.inFront) return a.inFront;
