@@ -1,6 +1,7 @@
 #include "platform/base/port.h"
 
 #include <cstring>
+#include <utility>
 
 #include "platform/base/receive_queue.h"
 #include "platform/base/run_loop.h"
@@ -38,6 +39,8 @@ struct PortSource final : Source {
   const Owned<Port> port;
 };
 
+std::function<void(std::span<const std::byte>, pid_t)> observe;
+
 /// Fills in what the receiver's kernel writes: the arrival port with a send disposition, no reply port, the
 /// size. Rights that a message pretends to carry stay visible as the complex bit.
 void stampHeader(std::vector<std::byte>& message, mach_port_t arrival) {
@@ -63,10 +66,15 @@ void PortSource::deliverOne(Port& port) {
   }
   stampHeader(datagram->bytes, port.name);
   ++port.counts.delivered;
+  if (observe) observe(datagram->bytes, datagram->sender);
   port.callback(HostPortRef(&port), datagram->bytes.data(), size, port.context);
 }
 
 }  // namespace
+
+void setMessageObserver(std::function<void(std::span<const std::byte>, pid_t)> observer) {
+  observe = std::move(observer);
+}
 
 PortCounts portCounts(HostPortRef port) {
   const auto* counted = as<Port>(port);

@@ -2,7 +2,12 @@
 // kept.
 #pragma once
 
+#include <sys/types.h>
+
+#include <cstddef>
 #include <cstdint>
+#include <functional>
+#include <span>
 
 #include "platform/base/object.h"
 #include "platform/base/service_directory.h"
@@ -17,5 +22,8 @@ struct PortCounts {
 };
 /// The port's counts since it was made; zeros for null.
 PortCounts portCounts(HostPortRef port);
+
+/// Told of every message that a callback is about to get, and which process sent it.
+void setMessageObserver(std::function<void(std::span<const std::byte> message, pid_t sender)> observer);
 
 }  // namespace base

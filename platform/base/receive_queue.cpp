@@ -18,13 +18,14 @@ std::map<mach_port_t, ReceiveQueue>& queues() {
   return all;
 }
 
-bool isTrusted(msghdr& datagram) {
+/// The credentials that the kernel has put beside a datagram.
+std::optional<ucred> senderOf(msghdr& datagram) {
   const cmsghdr* control = CMSG_FIRSTHDR(&datagram);
-  if ((datagram.msg_flags & MSG_TRUNC) != 0 || control == nullptr) return false;
-  if (control->cmsg_level != SOL_SOCKET || control->cmsg_type != SCM_CREDENTIALS) return false;
+  if (control == nullptr) return std::nullopt;
+  if (control->cmsg_level != SOL_SOCKET || control->cmsg_type != SCM_CREDENTIALS) return std::nullopt;
   ucred sender{};
   std::memcpy(&sender, CMSG_DATA(control), sizeof sender);
-  return sender.uid == geteuid();
+  return sender;
 }
 
 std::optional<Datagram> receive(int socket) {
@@ -41,7 +42,10 @@ std::optional<Datagram> receive(int socket) {
   datagram.msg_control = control.data();
   datagram.msg_controllen = control.size();
   if (recvmsg(socket, &datagram, MSG_DONTWAIT | MSG_CMSG_CLOEXEC) < 0) return std::nullopt;
-  received.trusted = isTrusted(datagram);
+  if (const auto sender = senderOf(datagram)) {
+    received.sender = sender->pid;
+    received.trusted = sender->uid == geteuid() && (datagram.msg_flags & MSG_TRUNC) == 0;
+  }
   return received;
 }
 

@@ -18,6 +18,7 @@
 #include "platform/stage/line_reader.h"
 #include "platform/stage/recording.h"
 #include "platform/stage/replay.h"
+#include "platform/stage/visitors.h"
 #include "remote/words.h"
 
 namespace stage {
@@ -60,6 +61,7 @@ int playLive(const LiveView& view) {
                  view.show);
   setSleepListener(view.asleep);
   setKeeper([](const std::string& command) { sRecording.add(command, moment()); });
+  watchVisitors();
   auto* const keyboard = new base::Source(STDIN_FILENO, kInputOrder, view.input);
   // The loop asks before each thing that it does.
   keyboard->prepare = [&view] {
@@ -72,6 +74,7 @@ int playLive(const LiveView& view) {
   HostRunLoopRemoveSource(HostRunLoopCurrent(), input, HostRunLoopMode::Default);
   HostRelease(input);
   view.idle();
+  ignoreVisitors();
   setKeeper(nullptr);
   setSleepListener(nullptr);
   setJournalListener(nullptr);
