@@ -182,6 +182,10 @@ def main():
     if missing or os.geteuid() != 0:
         print("skipped: " + (f"not installed: {', '.join(missing)}" if missing else "it takes root"))
         return 77
+    probe = ["unshare", "--mount", "--pid", "--fork", "mount", "-t", "cgroup2", "cgroup2", GROUPS]
+    if subprocess.run(probe, stderr=subprocess.DEVNULL, check=False).returncode != 0:
+        print("skipped: root may not mount its own control groups here")
+        return 77
     if sys.argv[1] == "--bin":
         os.execvp("unshare", ["unshare", "--mount", "--pid", "--fork", "--kill-child", "--mount-proc",
                               sys.executable, __file__, "--inside", *sys.argv[2:]])
