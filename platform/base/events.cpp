@@ -1,5 +1,7 @@
 #include "platform/base/values.h"
 
+#include <cstring>
+
 using base::EventContents;
 
 namespace {
@@ -42,6 +44,15 @@ std::int16_t HostCreateEvent(std::uint32_t eventClass, std::uint32_t eventID,
   contents->transactionID = transactionID;
   *event = {kEventType, contents};
   return 0;
+}
+
+std::optional<HostProcessSerialNumber> base::targetOf(const HostEventDescriptor* event) {
+  const auto* contents = event != nullptr ? base::as<EventContents>(event->contents) : nullptr;
+  HostProcessSerialNumber target;
+  if (contents == nullptr || !contents->isEvent || contents->data.size() != sizeof target)
+    return std::nullopt;
+  std::memcpy(&target, contents->data.data(), sizeof target);
+  return target;
 }
 
 std::int16_t HostDisposeDescriptor(HostEventDescriptor* descriptor) {

@@ -3,6 +3,7 @@
 #pragma once
 
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <utility>
 #include <variant>
@@ -76,6 +77,9 @@ struct EventContents final : HostObject {
   std::int16_t returnID = 0;
   std::int32_t transactionID = 0;
 };
+
+/// The process that an event is for; nothing for null, for plain data and for another kind of target.
+std::optional<HostProcessSerialNumber> targetOf(const HostEventDescriptor* event);
 
 /// The string's text; empty for null or another kind.
 const std::string& textOf(HostStringRef string);

@@ -1,6 +1,5 @@
 // Running applications, and events for one of them, as the host interface asks for them.
 
-#include <cstring>
 #include <string>
 #include <vector>
 
@@ -109,12 +108,11 @@ HostSerialNumberRef HostCopyFrontApplication(HostSessionID session) {
 
 std::int32_t HostSendEvent(const HostEventDescriptor* event, HostEventDescriptor*, std::int32_t,
                            std::int32_t) {
-  const auto* const contents = event != nullptr ? base::as<base::EventContents>(event->contents) : nullptr;
-  HostProcessSerialNumber target;
-  if (contents == nullptr || !contents->isEvent || contents->data.size() != sizeof target) return kBadEvent;
-  std::memcpy(&target, contents->data.data(), sizeof target);
-  const Instance* const instance = desktop::findInstance(target);
+  const auto target = base::targetOf(event);
+  if (!target) return kBadEvent;
+  const Instance* const instance = desktop::findInstance(*target);
   if (instance == nullptr) return kNoSuchProcess;
+  const auto* const contents = base::as<base::EventContents>(event->contents);
   if (contents->eventClass != kHookClass || contents->eventID != kRemoteSelect) return kNotUnderstood;
   desktop::bringToFront(*instance);
   return 0;

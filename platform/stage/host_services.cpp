@@ -1,6 +1,5 @@
 // The rest of the host interface: the service manager, notifications, inter-application events.
 
-#include <cstring>
 #include <map>
 #include <string>
 
@@ -40,12 +39,11 @@ void HostPostDistributedNotification(HostStringRef name, HostStringRef object,
 
 std::int32_t HostSendEvent(const HostEventDescriptor* event, HostEventDescriptor*, std::int32_t,
                            std::int32_t) {
-  const auto* const contents = event != nullptr ? base::as<base::EventContents>(event->contents) : nullptr;
-  HostProcessSerialNumber target;
-  if (contents == nullptr || !contents->isEvent || contents->data.size() != sizeof target) return kBadEvent;
-  std::memcpy(&target, contents->data.data(), sizeof target);
-  const stage::Process* const process = stage::findProcess(target);
+  const auto target = base::targetOf(event);
+  if (!target) return kBadEvent;
+  const stage::Process* const process = stage::findProcess(*target);
   if (process == nullptr) return kNoSuchProcess;
+  const auto* const contents = base::as<base::EventContents>(event->contents);
   stage::Application& application = *process->application;
   record(Entry::Event, "event " + stage::quoted(contents->eventClass) + "/" +
                            stage::quoted(contents->eventID) + " to " + application.name);
