@@ -1,4 +1,4 @@
-// latency_player NAME: a player on the session bus (MPRIS D-Bus Interface Specification 2.2) that plays
+// latency_player NAME: a player on the session bus (MPRIS 2.2) that plays
 // nothing.
 //
 // Writes a line "MEMBER NANOSECONDS" for every method call that it gets, with the time of its arrival on

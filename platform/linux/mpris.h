@@ -1,4 +1,4 @@
-// Players on the session bus (MPRIS D-Bus Interface Specification 2.2).
+// Players on the session bus (MPRIS 2.2).
 //
 // Signals keep the list of players. A player's playback status is taken from its signals once it has been
 // seen to send them, and asked for before that. Optional properties are read with GetAll, never with Get,

@@ -1,4 +1,4 @@
-// The names of the MPRIS D-Bus Interface Specification.
+// The names of MPRIS 2.2 on the bus.
 #pragma once
 
 #include <optional>

@@ -178,9 +178,10 @@ class Desktop:
         stays(lambda: self.kvd.poll() is None and ticks(self.kvd.pid) - before < 10, "kvd rests", 1)
 
     def last_words(self):
-        """The end of what the programs wrote."""
+        """The windows, and the end of what the programs wrote."""
         with open(os.path.join(self.home, "log"), encoding="utf-8", errors="replace") as log:
-            return "".join([line for line in log if "system_bus_socket" not in line][-40:])
+            lines = [line for line in log if "system_bus_socket" not in line]
+        return self.read("xwininfo", "-root", "-tree") + "\n" + "".join(lines[-40:])
 
     def names(self):
         """The names that are owned on the session bus."""
@@ -201,9 +202,9 @@ class Desktop:
     def settled(self):
         """Whether the program in front has nothing left to do."""
         pid = self.of_front("_NET_WM_PID").rpartition(" ")[2]
-        before = ticks(pid)
+        before = ticks(pid) if pid.isdigit() else -1
         time.sleep(0.3)
-        return ticks(pid) - before <= 1
+        return before >= 0 and ticks(pid) - before <= 1
 
     def full_screen(self):
         """The names of the full-screen windows."""
