@@ -2,6 +2,7 @@
 
 #include <poll.h>
 #include <sys/timerfd.h>
+#include <unistd.h>
 
 #include <algorithm>
 #include <array>
@@ -32,15 +33,32 @@ void sleepOnBootTime(Nanoseconds duration) {
   }
 }
 
-/// A timer descriptor that becomes readable at the deadline. A time-out of poll would not count the time that
-/// the machine sleeps. Made for one wait: a timer that is kept would be shared with forked children.
-FileDescriptor armedTimer(Nanoseconds deadline) {
-  FileDescriptor timer(timerfd_create(CLOCK_BOOTTIME, TFD_CLOEXEC | TFD_NONBLOCK));
-  // A time of zero would disarm it.
-  const itimerspec at{.it_interval = {}, .it_value = toTimespec(std::max<Nanoseconds>(deadline, 1))};
-  timerfd_settime(timer.get(), TFD_TIMER_ABSTIME, &at, nullptr);
-  return timer;
-}
+/// A descriptor that becomes readable at the deadline. A time-out of poll would not count the time that the
+/// machine sleeps.
+class Alarm {
+ public:
+  /// The descriptor, set for this deadline; borrowed.
+  int setFor(Nanoseconds deadline) {
+    // Kept between waits, as making and closing one costs a button some 20 µs. A forked child needs its own.
+    if (owner_ != getpid()) {
+      timer_ = FileDescriptor(timerfd_create(CLOCK_BOOTTIME, TFD_CLOEXEC | TFD_NONBLOCK));
+      owner_ = getpid();
+      deadline_.reset();
+    }
+    if (deadline != deadline_) {
+      // A time of zero would disarm it.
+      const itimerspec at{.it_interval = {}, .it_value = toTimespec(std::max<Nanoseconds>(deadline, 1))};
+      timerfd_settime(timer_.get(), TFD_TIMER_ABSTIME, &at, nullptr);
+      deadline_ = deadline;
+    }
+    return timer_.get();
+  }
+
+ private:
+  FileDescriptor timer_;
+  pid_t owner_ = 0;
+  std::optional<Nanoseconds> deadline_;
+};
 
 TimeSource& current() {
   static TimeSource source{.now = bootTime, .wait = waitForSources, .sleep = sleepOnBootTime};
@@ -50,10 +68,10 @@ TimeSource& current() {
 }  // namespace
 
 void waitForSources(std::optional<Nanoseconds> deadline) {
-  const FileDescriptor timer = deadline ? armedTimer(*deadline) : FileDescriptor();
+  static Alarm alarm;
   std::array<pollfd, 2> watched{};
   watched[0] = {.fd = runLoopDescriptor(), .events = POLLIN, .revents = 0};
-  watched[1] = {.fd = timer.get(), .events = POLLIN, .revents = 0};
+  watched[1] = {.fd = deadline ? alarm.setFor(*deadline) : -1, .events = POLLIN, .revents = 0};
   // An interruption only makes the loop look again.
   poll(watched.data(), watched.size(), -1);
 }
