@@ -111,7 +111,11 @@ bool takeLine(sd_bus* bus) {
   char line[64];
   if (read(STDIN_FILENO, line, sizeof line) <= 0) return false;
   setStatus(bus, "Playing");
-  sd_bus_flush(bus);
+  // The bus takes messages in order: once it has answered, the announcement is on its way to everybody.
+  if (sd_bus_call_method(bus, "org.freedesktop.DBus", "/org/freedesktop/DBus", "org.freedesktop.DBus",
+                         "GetId", nullptr, nullptr, "") < 0) {
+    return false;
+  }
   std::puts("playing");
   return true;
 }
