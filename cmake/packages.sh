@@ -66,7 +66,8 @@ require_packages() {
   fi
 
   echo "Installing ${missing[*]}" >&2
-  local apt=("${as_root[@]}" env DEBIAN_FRONTEND=noninteractive apt-get -qq -o DPkg::Lock::Timeout=300)
+  local apt=("${as_root[@]}" env DEBIAN_FRONTEND=noninteractive apt-get -qq -o DPkg::Lock::Timeout=300
+    -o Dpkg::Use-Pty=0)
   if ! {
     "${apt[@]}" update &&
       "${apt[@]}" install -y --no-install-recommends "${missing[@]}"
