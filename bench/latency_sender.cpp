@@ -43,6 +43,7 @@ bool run(const std::string& line) {
   std::istringstream stream(line);
   for (std::string word; std::getline(stream, word, '\t');) words.push_back(word);
   std::vector<char*> arguments;
+  arguments.reserve(words.size() + 1);
   for (std::string& word : words) arguments.push_back(word.data());
   arguments.push_back(nullptr);
   pid_t child = 0;

@@ -73,7 +73,7 @@ class Desktop:
         prctl(PR_SET_CHILD_SUBREAPER, 1)
 
     def bring(self, directory, media=None, programs="kv*"):
-        """Copies what is needed into the home: another user may not reach the originals. Then becomes that user."""
+        """Copies what is needed into the home, and becomes another user, who may not reach the originals."""
         os.mkdir(self.runtime, 0o700)
         for program in glob.glob(os.path.join(directory, programs)):
             shutil.copy(program, self.home)
@@ -104,7 +104,7 @@ class Desktop:
             for pid in pids:
                 os.kill(pid, signal.SIGKILL)
                 os.waitpid(pid, 0)
-        # Qt's shared memory outlives killed programs, and its keys (ftok) are those of later files with the same inodes.
+        # Qt's shared memory outlives killed programs. Its keys (ftok) come from inodes, which are used again.
         for path in glob.glob(f"{self.home}/qipc_*"):
             key = ord("Q") << 24 | (os.stat(path).st_dev & 0xFF) << 16 | os.stat(path).st_ino & 0xFFFF
             subprocess.call(["ipcrm", "-M" if "sharedmemory" in path else "-S", str(key)])
@@ -132,8 +132,8 @@ class Desktop:
 
     def set_up(self):
         reading, writing = os.pipe()
-        self.x = self.start("Xvfb", "-displayfd", str(writing), "-screen", "0", "1280x720x24", "-nolisten", "tcp",
-                   "-noreset", "-fbdir", self.home, pass_fds=[writing])
+        self.x = self.start("Xvfb", "-displayfd", str(writing), "-screen", "0", "1280x720x24",
+                            "-nolisten", "tcp", "-noreset", "-fbdir", self.home, pass_fds=[writing])
         os.close(writing)
         with os.fdopen(reading) as display:
             self.env["DISPLAY"] = ":" + display.readline().strip()
@@ -148,8 +148,8 @@ class Desktop:
         wait(self.names, "a session bus")
 
     def start_sound(self):
-        self.sound = self.start("pulseaudio", "-n", "--daemonize=no", "--exit-idle-time=-1", "--use-pid-file=0",
-                                "-L", "module-null-sink sink_name=test",
+        self.sound = self.start("pulseaudio", "-n", "--daemonize=no", "--exit-idle-time=-1",
+                                "--use-pid-file=0", "-L", "module-null-sink sink_name=test",
                                 "-L", "module-native-protocol-unix auth-anonymous=1")
         wait(lambda: self.read("pactl", "get-default-sink") == "test", "a sound server")
 
@@ -218,7 +218,8 @@ class Desktop:
             header = struct.unpack(">20I", screen.read(80))  # an X window dump: size, line length, colour map
             screen.seek(header[0] + header[19] * 12 + y * header[12] + x * 4)
             seen = screen.read(3)[::-1]
-        near = [number for number, colour in COLOURS.items() if all(abs(a - b) < 40 for a, b in zip(colour, seen))]
+        near = [number for number, colour in COLOURS.items()
+                if all(abs(a - b) < 40 for a, b in zip(colour, seen))]
         return near[0] if near else None
 
     def corner(self):
@@ -228,7 +229,8 @@ class Desktop:
         """The volume of the sound server, in percent; sets it first when given."""
         if percent is not None:
             self.read("pactl", "set-sink-volume", "@DEFAULT_SINK@", f"{percent}%")
-        return int((re.findall(r"(\d+)%", self.read("pactl", "get-sink-volume", "@DEFAULT_SINK@")) or [-1])[0])
+        told = self.read("pactl", "get-sink-volume", "@DEFAULT_SINK@")
+        return int((re.findall(r"(\d+)%", told) or [-1])[0])
 
     def muted(self):
         return self.read("pactl", "get-sink-mute", "@DEFAULT_SINK@") == "Mute: yes"

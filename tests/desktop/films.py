@@ -9,8 +9,8 @@ def scan_ends_in_the_state_before(desktop):
     film = Mpv(desktop, "--start=60")
     desktop.start_kvd()
     fast = {"pause": False, "speed": 2.0}
-    film.follow(("forward --press", fast), ("forward --release", ON), ("pause", OFF), ("forward --press", fast),
-                ("forward --release", OFF), ("play", ON))
+    film.follow(("forward --press", fast), ("forward --release", ON), ("pause", OFF),
+                ("forward --press", fast), ("forward --release", OFF), ("play", ON))
     start = film.get("time-pos")
     desktop.press("rewind", "--press")
     wait(lambda: film.get("time-pos") < start - 4, "the film goes back")

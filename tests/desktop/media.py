@@ -1,10 +1,11 @@
-"""Something to play, made on the spot: tracks, a film, a disc with a menu, slides and photos, told apart by colour."""
+"""Something to play, made on the spot: tracks, a film, a disc with a menu, slides and photos."""
 import fcntl
 import os
 import shutil
 import subprocess
 import tempfile
 
+# What slides, photos, titles of the disc and its menu are told apart by.
 COLOURS = {1: (255, 0, 0), 2: (0, 255, 0), 3: (0, 0, 255)}
 
 # The menu's two buttons go to the disc's two titles. The first title has chapters of 20 s.
@@ -72,13 +73,15 @@ def disc():
         ffmpeg(*picture(seconds, COLOURS[number], "720x576", 25), *sound(seconds), "-target", "pal-dvd",
                f"{name}.mpg")
     ffmpeg(*picture(1, (255, 255, 255), "720x576"), "-frames:v", "1", "-vf",
-           "format=rgba,geq=r=255:g=255:b=255:a='255*between(X,600,699)*(between(Y,100,199)+between(Y,300,399))'",
+           "format=rgba,geq=r=255:g=255:b=255:"
+           "a='255*between(X,600,699)*(between(Y,100,199)+between(Y,300,399))'",
            "highlight.png")
     write("spumux.xml", SPUMUX)
     write("dvdauthor.xml", DVDAUTHOR)
     for command in ("spumux spumux.xml < menu.mpg > buttons.mpg", "dvdauthor -x dvdauthor.xml",
                     "genisoimage -quiet -dvd-video -o disc.iso disc"):
-        subprocess.run(command, shell=True, check=True, capture_output=True, env={**os.environ, "VIDEO_FORMAT": "PAL"})
+        subprocess.run(command, shell=True, check=True, capture_output=True,
+                       env={**os.environ, "VIDEO_FORMAT": "PAL"})
 
 
 def slides():

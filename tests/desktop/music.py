@@ -6,7 +6,8 @@ PLAYING = {"PlaybackStatus": "Playing", "under_way": True}
 PAUSED, STOPPED = ({"PlaybackStatus": status} for status in ("Paused", "Stopped"))
 
 # A jukebox cast by its entry, which counts how often it was started.
-ENTRY = "[Desktop Entry]\nType=Application\nName=Counted\nExec={}/counted\nX-Kvd-Application=com.tarn.Lyrabox\n"
+ENTRY = ("[Desktop Entry]\nType=Application\nName=Counted\nExec={}/counted\n"
+         "X-Kvd-Application=com.tarn.Lyrabox\n")
 COUNTED = "#!/bin/sh\necho >>{0}/starts\nexec strawberry {0}/media/music/1.ogg\n"
 AUDIO_TYPES = ("mpeg", "flac", "ogg", "x-vorbis+ogg", "mp4", "x-wav")
 
@@ -16,8 +17,8 @@ def play_and_pause(desktop):
     desktop.start_kvd()
     music.follow(("playpause", {**PLAYING, "title": "Track 1"}), ("playpause", PAUSED), ("play", PLAYING),
                  ("pause", PAUSED), ("select", PLAYING), ("next", {**PLAYING, "title": "Track 2"}),
-                 ("right", {**PLAYING, "title": "Track 3"}), ("previous", {**PLAYING, "title": "Track 2"}), ("play", PAUSED),
-                 ("play", PLAYING), ("stop", PAUSED))
+                 ("right", {**PLAYING, "title": "Track 3"}), ("previous", {**PLAYING, "title": "Track 2"}),
+                 ("play", PAUSED), ("play", PLAYING), ("stop", PAUSED))
     stays(lambda: music.process.poll() is None, "the player runs after Stop")
 
 

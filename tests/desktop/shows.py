@@ -2,8 +2,8 @@
 from programs import Eog, Evince, Impress, Strawberry
 
 SLIDES = (("next", {"colour": 2}), ("right", {"colour": 3}), ("previous", {"colour": 2}),
-          ("rewind --press", {"colour": 1}), ("forward --press", {"colour": 3}), ("playpause", {"colour": None}),
-          ("playpause", {"colour": 3}), ("stop", {"full_screen": []}))
+          ("rewind --press", {"colour": 1}), ("forward --press", {"colour": 3}),
+          ("playpause", {"colour": None}), ("playpause", {"colour": 3}), ("stop", {"full_screen": []}))
 
 
 def slides(desktop):

@@ -17,7 +17,8 @@ def held_volume_goes_on_until_release(desktop):
 
 def volume_goes_by_five_within_its_limits(desktop):
     desktop.start_kvd()
-    for button, start, end in (("volume-up", 50, 55), ("volume-down", 50, 45), ("up", 98, 100), ("down", 3, 0)):
+    for button, start, end in (("volume-up", 50, 55), ("volume-down", 50, 45),
+                               ("up", 98, 100), ("down", 3, 0)):
         desktop.volume(start)
         desktop.press(button)
         wait(lambda: desktop.volume() == end, f"{button} leads from {start} to {end}")
@@ -34,6 +35,7 @@ def full_volume_raises_the_players_own(desktop):
     music.follow(("volume-up", {"Volume": 0.52, "volume": 100}))
     film = Mpv(desktop, "--volume=50")
     desktop.read("pactl", "set-sink-mute", "@DEFAULT_SINK@", "1")
-    film.follow(("volume-up", {"Volume": 0.5625, "volume": 100, "muted": False}), ("volume-down", {"volume": 95}))
+    film.follow(("volume-up", {"Volume": 0.5625, "volume": 100, "muted": False}),
+                ("volume-down", {"volume": 95}))
     film.become(Volume=0.5625)
     music.become(Volume=0.52)
