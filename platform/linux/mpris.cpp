@@ -199,7 +199,11 @@ std::vector<std::string> trackListOf(Player& player) {
 }
 
 void play(Player& player) {
-  if (statusOf(player) != PlaybackStatus::Playing) bringTo(player, PlaybackStatus::Playing, "Play");
+  const PlaybackStatus status = statusOf(player);
+  if (status == PlaybackStatus::Playing) return;
+  const bool ignoresPlay =
+      status == PlaybackStatus::Stopped && (quirksOf(player) & kIgnoresPlayWhenStopped) != 0;
+  bringTo(player, PlaybackStatus::Playing, ignoresPlay ? "PlayPause" : "Play");
 }
 
 void pause(Player& player) {

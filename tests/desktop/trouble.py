@@ -3,7 +3,7 @@ import os
 import signal
 
 from desktop import Failed, wait
-from music import PAUSED, PLAYING
+from music import AT_REST, PAUSED, PLAYING
 from programs import Mpv, Strawberry
 
 
@@ -15,7 +15,7 @@ def player_dies_in_mid_scan(desktop):
     film.end()
     desktop.press("rewind", "--release")
     desktop.rests()
-    music.follow(("play", PLAYING), ("play", PAUSED))
+    music.follow(("play", PLAYING), ("play", AT_REST))
 
 
 def player_hangs(desktop):
@@ -33,7 +33,8 @@ def player_hangs(desktop):
         os.kill(player.process.pid, signal.SIGCONT)
     music.become(**PAUSED)
     film.end()
-    music.follow(("play", PLAYING), ("play", PAUSED))
+    music.become(**AT_REST)
+    music.follow(("play", PLAYING), ("play", AT_REST))
 
 
 def sound_server_restarts(desktop):
@@ -64,7 +65,7 @@ def bus_restarts(desktop):
     desktop.rests()
     music.end()
     desktop.start_bus()
-    Strawberry(desktop).follow(("play", PLAYING), ("play", PAUSED))
+    Strawberry(desktop).follow(("play", PLAYING), ("play", AT_REST))
 
 
 def window_server_goes(desktop):
@@ -80,7 +81,7 @@ def window_server_goes(desktop):
 def without_window_server(desktop):
     music = Strawberry(desktop)
     desktop.start_kvd(DISPLAY=None)
-    music.follow(("play", PLAYING), ("play", PAUSED))
+    music.follow(("play", PLAYING), ("play", AT_REST))
 
 
 def refuses_to_start(desktop):
