@@ -199,11 +199,7 @@ std::vector<std::string> trackListOf(Player& player) {
 }
 
 void play(Player& player) {
-  const PlaybackStatus status = statusOf(player);
-  if (status == PlaybackStatus::Playing) return;
-  const bool ignoresPlay =
-      status == PlaybackStatus::Stopped && (quirksOf(player) & kIgnoresPlayWhenStopped) != 0;
-  bringTo(player, PlaybackStatus::Playing, ignoresPlay ? "PlayPause" : "Play");
+  if (statusOf(player) != PlaybackStatus::Playing) bringTo(player, PlaybackStatus::Playing, "Play");
 }
 
 void pause(Player& player) {

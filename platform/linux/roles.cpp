@@ -26,7 +26,7 @@ constexpr RoleRow kRoles[] = {
 // clang-format off: one program a line. Within a role the first that is installed is the default.
 constexpr Program kPrograms[] = {
     {Role::Jukebox, "Strawberry", "org.strawberrymusicplayer.strawberry", "strawberry", "strawberry",
-     kIgnoresRate | kIgnoresPlayWhenStopped},
+     kIgnoresRate},
     {Role::Jukebox, "Rhythmbox", "org.gnome.Rhythmbox3", "rhythmbox", "rhythmbox", kIgnoresRate},
     {Role::Jukebox, "Elisa", "org.kde.elisa", "elisa", "elisa", kIgnoresRate},
     {Role::Jukebox, "Lollypop", "org.gnome.Lollypop", "Lollypop", "lollypop", kIgnoresRate},

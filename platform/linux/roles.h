@@ -30,8 +30,6 @@ enum Quirk : std::uint8_t {
   kIgnoresRate = 1,
   /// Raise succeeds and raises nothing.
   kIgnoresRaise = 2,
-  /// Play leaves a stopped player as it is; PlayPause starts it.
-  kIgnoresPlayWhenStopped = 4,
 };
 
 /// A well-known program. Empty texts are names that it does not have.

@@ -62,7 +62,6 @@ def music():
     os.mkdir("music")
     for number in COLOURS:
         ffmpeg(*sound(60, 220 * number), "-metadata", f"title=Track {number}", f"music/{number}.ogg")
-    write("music/all.m3u", "".join(f"{number}.ogg\n" for number in COLOURS))
 
 
 def film():

@@ -1,4 +1,5 @@
 """The programs that play roles, each with something to play, and what they tell of themselves."""
+import glob
 import json
 import socket
 
@@ -64,23 +65,15 @@ class Player(Program):
         return (self.get("Position") or 0) / 1e6
 
     def under_way(self):
-        """While they load a track, players lose what they are told and pass through states that do not last."""
-        before = self.position()
-        return 0.1 < before < self.position()
+        """Some players lose what they are told while they load."""
+        return self.position() > 0.1
 
 
 class Strawberry(Player):
-    SETTINGS = (".config/strawberry/strawberry.conf", "[MainWindow]\ndo_not_show_sponsor_message=true\n")
-
-    def __init__(self, desktop, command=("strawberry",)):
-        """With three tracks to play. An empty command where it is started by others."""
-        desktop.write(*self.SETTINGS)
-        super().__init__(desktop, "strawberry", "strawberry", *command)
-        # Given tracks when it is started, version 1.2 forgets them.
-        self.ask("call", "OpenUri", "s", f"file://{desktop.media}/music/all.m3u")
-        self.become(CanGoNext=True, title="Track 1", under_way=True)
-        self.ask("call", "Stop")
-        self.become(PlaybackStatus="Stopped")
+    def __init__(self, desktop):
+        tracks = sorted(glob.glob(f"{desktop.media}/music/*"))
+        super().__init__(desktop, "strawberry", "strawberry", "strawberry", *tracks)
+        self.become(CanGoNext=True)
 
 
 class Mpv(Player):

@@ -3,7 +3,7 @@ import os
 import signal
 
 from desktop import Failed, wait
-from music import AT_REST, PAUSED, PLAYING
+from music import PAUSED, PLAYING
 from programs import Mpv, Strawberry
 
 
@@ -15,7 +15,7 @@ def player_dies_in_mid_scan(desktop):
     film.end()
     desktop.press("rewind", "--release")
     desktop.rests()
-    music.follow(("play", PLAYING), ("play", AT_REST))
+    music.follow(("play", PLAYING), ("play", PAUSED))
 
 
 def player_hangs(desktop):
@@ -33,8 +33,7 @@ def player_hangs(desktop):
         os.kill(player.process.pid, signal.SIGCONT)
     music.become(**PAUSED)
     film.end()
-    music.become(**AT_REST)
-    music.follow(("play", PLAYING), ("play", AT_REST))
+    music.follow(("play", PLAYING), ("play", PAUSED))
 
 
 def sound_server_restarts(desktop):
@@ -65,7 +64,7 @@ def bus_restarts(desktop):
     desktop.rests()
     music.end()
     desktop.start_bus()
-    Strawberry(desktop).follow(("play", PLAYING), ("play", AT_REST))
+    Strawberry(desktop).follow(("play", PLAYING), ("play", PAUSED))
 
 
 def window_server_goes(desktop):
@@ -81,7 +80,7 @@ def window_server_goes(desktop):
 def without_window_server(desktop):
     music = Strawberry(desktop)
     desktop.start_kvd(DISPLAY=None)
-    music.follow(("play", PLAYING), ("play", AT_REST))
+    music.follow(("play", PLAYING), ("play", PAUSED))
 
 
 def refuses_to_start(desktop):
