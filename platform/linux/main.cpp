@@ -1,8 +1,8 @@
 #include "daemon/lifecycle.h"
 #include "platform/base/port_names.h"
 #include "platform/base/run_loop.h"
-#include "platform/linux/bus.h"
-#include "platform/linux/script_world.h"
+#include "platform/linux/system/bus.h"
+#include "platform/linux/roles/script_world.h"
 
 int main() {
   base::endLoopOnSignals();

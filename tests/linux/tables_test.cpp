@@ -9,9 +9,9 @@
 #include <utility>
 #include <vector>
 
-#include "platform/linux/casting.h"
-#include "platform/linux/deeds.h"
-#include "platform/linux/own_words.h"
+#include "platform/linux/programs/casting.h"
+#include "platform/linux/roles/deeds.h"
+#include "platform/linux/roles/own_words.h"
 #include "platform/scripting/keyhouse_dictionary.h"
 #include "platform/scripting/lyrabox_dictionary.h"
 #include "platform/scripting/movie_dictionaries.h"

@@ -1,0 +1,119 @@
+// Running applications, and events for one of them, as the host interface asks for them.
+
+#include <string>
+#include <vector>
+
+#include "platform/base/values.h"
+#include "platform/host.h"
+#include "platform/linux/programs/running.h"
+#include "platform/tarnscript/tarnscript.h"
+
+namespace {
+
+using desktop::Instance;
+using desktop::Role;
+
+/// Photo programs are spoken to in the words of this generation, which asks whether a slide show runs.
+constexpr const char* kPhotoLibraryVersion = "8.0";
+
+constexpr std::uint32_t kHookClass = tarnscript::code("hook");
+constexpr std::uint32_t kRemoteSelect = tarnscript::code("RSel");
+
+// Results of HostSendEvent other than success.
+constexpr std::int32_t kNoSuchProcess = -600;
+constexpr std::int32_t kBadEvent = -50;
+constexpr std::int32_t kNotUnderstood = -1708;
+
+/// One value of a program's information, owned; null for an unknown key.
+HostObject* copyInformation(const Instance& instance, HostStringRef key) {
+  if (HostStringsAreEqual(key, HostGetBundleIdentifierKey())) {
+    return new base::String(desktop::bundleIdentifier(instance.role));
+  }
+  if (HostStringsAreEqual(key, HostGetBundleVersionKey())) {
+    return instance.role == Role::PhotoLibrary ? new base::String(kPhotoLibraryVersion) : nullptr;
+  }
+  if (HostStringsAreEqual(key, HostGetSerialNumberKey())) {
+    return new base::SerialNumber(instance.serialNumber);
+  }
+  return nullptr;
+}
+
+bool matches(const Instance& instance, std::size_t count, const HostStringRef* keys,
+             HostObject* const* values) {
+  for (std::size_t i = 0; i < count; ++i) {
+    const base::Owned<HostObject> actual(copyInformation(instance, keys[i]));
+    if (!HostStringsAreEqual(HostAsString(actual.get()), HostAsString(values[i]))) return false;
+  }
+  return true;
+}
+
+/// As the list stands: a button asks about every program several times, and has asked for the seed before.
+const Instance* instanceOf(HostSessionID session, HostSerialNumberRef serialNumber) {
+  const auto* const number = base::as<base::SerialNumber>(serialNumber);
+  if (session != kHostDefaultSession || number == nullptr) return nullptr;
+  return desktop::findInstance(number->process);
+}
+
+/// Every role, so that the instances of each come in their own order.
+constexpr Role kRoles[] = {
+    Role::Jukebox,      Role::DiscPlayer,   Role::ClassicMovies,      Role::ModernMovies,
+    Role::Presentation, Role::PhotoLibrary, Role::ProfessionalPhotos,
+};
+
+}  // namespace
+
+std::uint32_t HostGetApplicationListSeed(HostSessionID session) {
+  if (session != kHostDefaultSession) return 0;
+  desktop::takeInDesktop();
+  return desktop::applicationListSeed();
+}
+
+HostListRef HostFindRunningApplications(HostSessionID session, std::size_t count, const HostStringRef* keys,
+                                        HostObject* const* values) {
+  if (session != kHostDefaultSession) return nullptr;
+  desktop::takeInDesktop();
+  std::vector<HostObject*> found;
+  for (const Role role : kRoles) {
+    for (const Instance* instance : desktop::instancesOf(role)) {
+      if (matches(*instance, count, keys, values)) {
+        found.push_back(new base::SerialNumber(instance->serialNumber));
+      }
+    }
+  }
+  return HostListRef(new base::List(std::move(found)));
+}
+
+HostDictionaryRef HostCopyApplicationInformation(HostSessionID session, HostSerialNumberRef serialNumber,
+                                                 HostStringRef key) {
+  const Instance* const instance = instanceOf(session, serialNumber);
+  if (instance == nullptr) return nullptr;
+  HostObject* const value = copyInformation(*instance, key);
+  base::Dictionary::Entries entries;
+  if (value != nullptr) entries.emplace_back(base::textOf(key), value);
+  return HostDictionaryRef(new base::Dictionary(std::move(entries)));
+}
+
+HostObject* HostCopyApplicationInformationItem(HostSessionID session, HostSerialNumberRef serialNumber,
+                                               HostStringRef key) {
+  const Instance* const instance = instanceOf(session, serialNumber);
+  return instance != nullptr ? copyInformation(*instance, key) : nullptr;
+}
+
+HostSerialNumberRef HostCopyFrontApplication(HostSessionID session) {
+  if (session != kHostDefaultSession) return nullptr;
+  desktop::takeInDesktop();
+  const Instance* const front = desktop::frontInstance();
+  return front != nullptr ? HostSerialNumberRef(new base::SerialNumber(front->serialNumber)) : nullptr;
+}
+
+std::int32_t HostSendEvent(const HostEventDescriptor* event, HostEventDescriptor*, std::int32_t,
+                           std::int32_t) {
+  const auto target = base::targetOf(event);
+  if (!target) return kBadEvent;
+  const Instance* const instance = desktop::findInstance(*target);
+  if (instance == nullptr) return kNoSuchProcess;
+  const auto* const contents = base::as<base::EventContents>(event->contents);
+  if (contents->eventClass != kHookClass || contents->eventID != kRemoteSelect) return kNotUnderstood;
+  desktop::bringToFront(*instance);
+  return 0;
+}

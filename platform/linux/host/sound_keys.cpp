@@ -1,0 +1,22 @@
+// Event records: the sound keys are the only ones that kvd posts.
+
+#include "platform/base/event_record.h"
+#include "platform/host.h"
+#include "platform/linux/sound/sound_keys.h"
+
+namespace {
+
+constexpr std::int32_t kParameterError = -50;
+
+}  // namespace
+
+std::int32_t HostClearEventRecord(void* record, std::uint32_t length) {
+  return base::clearEventRecord(record, length) ? 0 : kParameterError;
+}
+
+std::int32_t HostPostEventRecord(HostConnectionID connection, const void* record, std::uint32_t length,
+                                 std::int32_t) {
+  if (connection == 0 || record == nullptr || !base::isEventRecordLength(length)) return kParameterError;
+  if (const auto key = base::soundKeyIn(record)) desktop::pressSoundKey(*key);
+  return 0;
+}

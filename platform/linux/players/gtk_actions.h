@@ -1,0 +1,20 @@
+// The actions that GTK programs export on the session bus (org.gtk.Actions): they work unfocused, and do not
+// depend on the keyboard.
+//
+// An action is "win.NAME" of the window that a person would type into, or "app.NAME" of its program.
+#pragma once
+
+#include <optional>
+
+#include "platform/linux/programs/running.h"
+
+namespace desktop {
+
+/// Activates an action and does not wait, as the answer says nothing; "win.NAME=true" and "win.NAME=false"
+/// bring an action with a boolean state into that state instead. False when the window exports no actions.
+bool activateAction(const Instance& instance, const char* action);
+
+/// The state of an action with a boolean state. Nothing when there is no such action, or no answer.
+std::optional<bool> actionState(const Instance& instance, const char* action);
+
+}  // namespace desktop

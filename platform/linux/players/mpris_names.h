@@ -1,0 +1,31 @@
+// The names of MPRIS 2.2 on the bus.
+#pragma once
+
+#include <optional>
+#include <string_view>
+
+#include "platform/linux/players/mpris.h"
+
+namespace desktop::mpris {
+
+/// How the bus names of all players begin, without the last dot, and with it.
+inline constexpr const char* kNamespace = "org.mpris.MediaPlayer2";
+inline constexpr std::string_view kPrefix = "org.mpris.MediaPlayer2.";
+
+inline constexpr const char* kPath = "/org/mpris/MediaPlayer2";
+inline constexpr const char* kRootInterface = "org.mpris.MediaPlayer2";
+inline constexpr const char* kPlayerInterface = "org.mpris.MediaPlayer2.Player";
+inline constexpr const char* kTrackListInterface = "org.mpris.MediaPlayer2.TrackList";
+inline constexpr const char* kPropertiesInterface = "org.freedesktop.DBus.Properties";
+
+inline constexpr const char* kPlaybackStatus = "PlaybackStatus";
+
+/// What a text of the property PlaybackStatus means; nothing for any other text.
+inline std::optional<PlaybackStatus> statusNamed(std::string_view text) {
+  if (text == "Playing") return PlaybackStatus::Playing;
+  if (text == "Paused") return PlaybackStatus::Paused;
+  if (text == "Stopped") return PlaybackStatus::Stopped;
+  return std::nullopt;
+}
+
+}  // namespace desktop::mpris

@@ -1,0 +1,220 @@
+// Keeps the list of players: who has come to the bus and left it, who they say they are, and what status they
+// tell.
+
+#include <algorithm>
+#include <charconv>
+#include <map>
+#include <utility>
+
+#include "platform/host.h"
+#include "platform/linux/system/bus_values.h"
+#include "platform/linux/players/mpris.h"
+#include "platform/linux/players/mpris_names.h"
+
+namespace desktop {
+
+namespace {
+
+/// A player for other players; its status is that of somebody who is on the list already.
+constexpr std::string_view kProxy = "playerctld";
+
+const Callee kBusItself{"org.freedesktop.DBus", 0};
+constexpr const char* kBusPath = "/org/freedesktop/DBus";
+constexpr const char* kBusInterface = "org.freedesktop.DBus";
+
+std::list<Player> sPlayers;
+/// The owner of each name that players have on the bus, without the prefix. A player may have several.
+std::map<std::string, std::string> sOwners;
+bool sChanged = false;
+/// The connection that all this is known from.
+unsigned sGeneration = 0;
+
+Player* playerWithOwner(std::string_view owner) {
+  const auto found = std::find_if(sPlayers.begin(), sPlayers.end(),
+                                  [&](const Player& player) { return player.callee.name == owner; });
+  return found != sPlayers.end() ? &*found : nullptr;
+}
+
+/// The identifier of a desktop entry, as a player tells it; never a path.
+std::string entryFrom(std::string text) {
+  constexpr std::string_view kSuffix = ".desktop";
+  if (text.ends_with(kSuffix)) text.resize(text.size() - kSuffix.size());
+  return text.find('/') == std::string::npos ? text : std::string();
+}
+
+int takeIntroduction(sd_bus_message* answer, void*, sd_bus_error*) {
+  const char* const sender = sd_bus_message_get_sender(answer);
+  Player* const player = sender != nullptr ? playerWithOwner(sender) : nullptr;
+  if (player == nullptr) return 0;
+  if (sd_bus_message_is_method_error(answer, nullptr) != 0) {
+    player->introduction = Introduction::Refused;
+    return 0;
+  }
+  player->introduction = Introduction::Complete;
+  readDictionary(answer, [&](std::string_view key, std::string_view type) {
+    if (key == "DesktopEntry") player->desktopEntry = entryFrom(readText(answer, type).value_or(""));
+  });
+  sChanged = true;
+  return 0;
+}
+
+/// Asks who it is, for as long as the player is there: one that is stopped answers when it is continued.
+void introduce(Player& player) {
+  const Message request = makeCall(player.callee, {mpris::kPath, mpris::kPropertiesInterface, "GetAll"});
+  if (request != nullptr && sd_bus_message_append(request.get(), "s", mpris::kRootInterface) >= 0 &&
+      sd_bus_call_async(bus(), nullptr, request.get(), takeIntroduction, nullptr, UINT64_MAX) >= 0) {
+    player.introduction = Introduction::Awaited;
+  }
+}
+
+void arrive(const std::string& name, const std::string& owner) {
+  sOwners[name] = owner;
+  if (playerWithOwner(owner) != nullptr) return;
+  Player& player = sPlayers.emplace_back();
+  player.name = name;
+  player.callee = {owner, processBehind(owner.c_str())};
+  sChanged = true;
+  introduce(player);
+}
+
+void leave(const std::string& name) {
+  const auto left = sOwners.find(name);
+  if (left == sOwners.end()) return;
+  const std::string owner = std::move(left->second);
+  sOwners.erase(left);
+  const auto other =
+      std::find_if(sOwners.begin(), sOwners.end(), [&](const auto& entry) { return entry.second == owner; });
+  sChanged = true;
+  if (other == sOwners.end()) {
+    std::erase_if(sPlayers, [&](const Player& player) { return player.callee.name == owner; });
+  } else if (Player* const player = playerWithOwner(owner)) {
+    player->name = other->first;
+  }
+}
+
+/// The part of a player's name after the prefix; empty for other names, and for the proxy's.
+std::string playerName(std::string_view busName) {
+  if (!busName.starts_with(mpris::kPrefix)) return {};
+  busName.remove_prefix(mpris::kPrefix.size());
+  return busName != kProxy ? std::string(busName) : std::string();
+}
+
+int takeOwnerChange(sd_bus_message* signal, void*, sd_bus_error*) {
+  const char* name = nullptr;
+  const char* before = nullptr;
+  const char* after = nullptr;
+  if (sd_bus_message_read(signal, "sss", &name, &before, &after) <= 0) return 0;
+  const std::string player = playerName(name);
+  if (player.empty()) return 0;
+  if (*before != '\0') leave(player);
+  if (*after != '\0') arrive(player, after);
+  return 0;
+}
+
+/// A status that comes while another one is wished for is from before the command.
+void takeStatus(Player& player, PlaybackStatus status) {
+  if (player.wish && player.wish->status != status && HostAbsoluteTime() < player.wish->until) return;
+  player.status = status;
+  player.wish.reset();
+}
+
+int takePropertyChange(sd_bus_message* signal, void*, sd_bus_error*) {
+  const char* const sender = sd_bus_message_get_sender(signal);
+  Player* const player = sender != nullptr ? playerWithOwner(sender) : nullptr;
+  const char* interface = nullptr;
+  if (player == nullptr || sd_bus_message_read(signal, "s", &interface) <= 0) return 0;
+  readDictionary(signal, [&](std::string_view key, std::string_view type) {
+    if (key != mpris::kPlaybackStatus) return;
+    if (const auto status = mpris::statusNamed(readText(signal, type).value_or(""))) {
+      takeStatus(*player, *status);
+    }
+  });
+  if (sd_bus_message_enter_container(signal, SD_BUS_TYPE_ARRAY, "s") <= 0) return 0;
+  while (const auto invalidated = readText(signal, "s")) {
+    if (*invalidated == mpris::kPlaybackStatus) player->status.reset();
+  }
+  return 0;
+}
+
+/// Connections are numbered as they come to the bus.
+std::uint64_t numberOf(const std::string& uniqueName) {
+  std::uint64_t number = 0;
+  const std::size_t dot = uniqueName.rfind('.');
+  if (dot != std::string::npos) {
+    std::from_chars(uniqueName.data() + dot + 1, uniqueName.data() + uniqueName.size(), number);
+  }
+  return number;
+}
+
+void findPlayers() {
+  const Message answer = call(kBusItself, {kBusPath, kBusInterface, "ListNames"}, kQueryLimit, "");
+  if (answer == nullptr || sd_bus_message_enter_container(answer.get(), SD_BUS_TYPE_ARRAY, "s") <= 0) return;
+  std::vector<std::pair<std::string, std::string>> found;
+  while (const auto name = readText(answer.get(), "s")) {
+    const std::string player = playerName(*name);
+    if (player.empty()) continue;
+    const Message owner =
+        call(kBusItself, {kBusPath, kBusInterface, "GetNameOwner"}, kQueryLimit, "s", name->c_str());
+    const char* uniqueName = nullptr;
+    if (owner == nullptr || sd_bus_message_read(owner.get(), "s", &uniqueName) <= 0) continue;
+    found.emplace_back(player, uniqueName);
+  }
+  std::sort(found.begin(), found.end(), [](const auto& a, const auto& b) {
+    return std::pair(numberOf(a.second), a.first) < std::pair(numberOf(b.second), b.first);
+  });
+  for (const auto& [name, owner] : found) arrive(name, owner);
+}
+
+void beginAnew() {
+  sChanged = sChanged || !sPlayers.empty();
+  sPlayers.clear();
+  sOwners.clear();
+  sGeneration = busGeneration();
+  if (bus() == nullptr) return;
+  const std::string arrivals = std::string("type='signal',sender='org.freedesktop.DBus',") +
+                               "interface='org.freedesktop.DBus',member='NameOwnerChanged'," +
+                               "arg0namespace='" + mpris::kNamespace + "'";
+  const std::string changes = std::string("type='signal',path='") + mpris::kPath + "',interface='" +
+                              mpris::kPropertiesInterface + "',member='PropertiesChanged',arg0='" +
+                              mpris::kPlayerInterface + "'";
+  sd_bus_add_match_async(bus(), nullptr, arrivals.c_str(), takeOwnerChange, nullptr, nullptr);
+  sd_bus_add_match_async(bus(), nullptr, changes.c_str(), takePropertyChange, nullptr, nullptr);
+  findPlayers();
+}
+
+bool anyAwaited() {
+  return std::any_of(sPlayers.begin(), sPlayers.end(),
+                     [](const Player& player) { return player.introduction == Introduction::Awaited; });
+}
+
+/// Waits for newcomers to introduce themselves; one that does not is a late one from then on.
+void awaitIntroductions() {
+  for (Player& player : sPlayers) {
+    if (player.introduction == Introduction::Refused) introduce(player);
+  }
+  const double deadline = HostAbsoluteTime() + static_cast<double>(kQueryLimit) / 1e6;
+  while (anyAwaited()) {
+    takeInBus();
+    const double left = deadline - HostAbsoluteTime();
+    if (!anyAwaited() || left <= 0 || bus() == nullptr) break;
+    if (sd_bus_wait(bus(), static_cast<Microseconds>(left * 1e6)) < 0) break;
+  }
+  for (Player& player : sPlayers) {
+    if (player.introduction != Introduction::Awaited) continue;
+    player.introduction = Introduction::Late;
+    noteTimeout(player.callee.process);
+  }
+}
+
+}  // namespace
+
+bool takeInPlayers() {
+  if (bus() == nullptr || sGeneration != busGeneration()) beginAnew();
+  takeInBus();
+  awaitIntroductions();
+  return std::exchange(sChanged, false);
+}
+
+std::list<Player>& players() { return sPlayers; }
+
+}  // namespace desktop

@@ -1,0 +1,129 @@
+#include "platform/linux/players/scan.h"
+
+#include <algorithm>
+#include <cmath>
+#include <list>
+#include <utility>
+
+#include "platform/host.h"
+#include "platform/tarnscript/tarnscript.h"
+
+namespace desktop {
+
+namespace {
+
+/// How often a scan seeks, in seconds.
+constexpr double kInterval = 0.25;
+/// The longest step that a seek makes up for, when the machine slept or the loop was held up, in seconds.
+constexpr double kLongestStep = 2;
+/// A scan forward ends so far before the end, in microseconds: what plays then ends by itself.
+constexpr std::int64_t kBeforeEnd = 1'000'000;
+
+/// Faster than anything is of use.
+constexpr double kFastest = 1000;
+
+struct Scan {
+  std::string owner;
+  double rate;
+  /// What the player did when the scan began. Whoever changes that ends the scan; that it does something
+  /// else for one step may come from the seek.
+  PlaybackStatus status;
+  bool strayed;
+  /// What is scanned, and where in it the scan stands. Players that seek to the nearest key frame or answer
+  /// with an old position do not hold it up.
+  std::string trackID;
+  std::string url;
+  std::int64_t position;
+  /// When it stood there, on the clock of HostAbsoluteTime.
+  double when;
+  HostTimerRef timer;
+};
+
+std::list<Scan> sScans;
+
+std::list<Scan>::iterator scanOf(const Player& player) {
+  return std::find_if(sScans.begin(), sScans.end(),
+                      [&](const Scan& scan) { return scan.owner == player.callee.name; });
+}
+
+void end(std::list<Scan>::iterator scan) {
+  HostInvalidateTimer(scan->timer);
+  HostRelease(scan->timer);
+  sScans.erase(scan);
+}
+
+Player* playerOf(const Scan& scan) {
+  for (Player& player : players()) {
+    if (player.callee.name == scan.owner) return &player;
+  }
+  return nullptr;
+}
+
+/// One seek. False when the scan has come to an end.
+bool step(Scan& scan) {
+  Player* const player = playerOf(scan);
+  if (player == nullptr) return false;
+  const PlayerState state = stateOf(*player);
+  const bool strayedBefore = std::exchange(scan.strayed, state.told != scan.status);
+  if (scan.strayed && strayedBefore) return false;
+  if (state.trackID != scan.trackID || state.url != scan.url) {
+    scan.trackID = state.trackID;
+    scan.url = state.url;
+    scan.position = state.position;
+  }
+  const double now = HostAbsoluteTime();
+  scan.position += static_cast<std::int64_t>(scan.rate * std::min(now - scan.when, kLongestStep) * 1e6);
+  scan.when = now;
+  const bool atBeginning = scan.position <= 0;
+  const bool atEnd = state.length && scan.position >= *state.length - kBeforeEnd;
+  seekTo(*player, state, atEnd ? *state.length - kBeforeEnd : scan.position);
+  return !atBeginning && !atEnd;
+}
+
+void tick(HostTimerRef timer, void*) {
+  const auto scan =
+      std::find_if(sScans.begin(), sScans.end(), [&](const Scan& one) { return one.timer == timer; });
+  if (scan == sScans.end()) return;
+  bool goesOn = false;
+  try {
+    goesOn = step(*scan);
+  } catch (const tarnscript::Refusal&) {
+    // A player that does not answer or cannot seek is not scanned any longer.
+  }
+  if (!goesOn) end(scan);
+}
+
+}  // namespace
+
+void scan(Player& player, double rate) {
+  if (!std::isfinite(rate)) throw tarnscript::Refusal{"that is no rate"};
+  rate = std::clamp(rate, -kFastest, kFastest);
+  const auto present = scanOf(player);
+  if (present != sScans.end()) {
+    present->rate = rate;
+    return;
+  }
+  const PlayerState state = stateOf(player);
+  if (!state.canSeek || state.status == PlaybackStatus::Stopped) {
+    throw tarnscript::Refusal{"there is nothing to scan through"};
+  }
+  const double now = HostAbsoluteTime();
+  const HostTimerRef timer = HostCreateRepeatingTimer(now + kInterval, kInterval, tick, nullptr);
+  if (!timer) throw tarnscript::Refusal{"there is no timer"};
+  sScans.push_back(
+      {player.callee.name, rate, state.status, false, state.trackID, state.url, state.position, now, timer});
+  HostRunLoopAddTimer(HostRunLoopCurrent(), timer, HostRunLoopMode::Default);
+}
+
+void endScan(Player& player) {
+  const auto present = scanOf(player);
+  if (present != sScans.end()) end(present);
+}
+
+std::optional<double> scanRate(const Player& player) {
+  const auto present = scanOf(player);
+  if (present == sScans.end()) return std::nullopt;
+  return present->rate;
+}
+
+}  // namespace desktop

@@ -1,0 +1,52 @@
+#include "platform/linux/programs/casting.h"
+
+#include "platform/linux/programs/entries.h"
+
+namespace desktop {
+
+namespace {
+
+Casting decide(const Entry* entry, const Program* program, bool bystander) {
+  Casting casting;
+  casting.program = program;
+  if (entry != nullptr) {
+    casting.entry = entry->id;
+  } else if (program != nullptr) {
+    casting.entry = program->entry;
+  }
+  const bool castByPerson = entry != nullptr && entry->cast;
+  if (bystander && !castByPerson) return casting;
+  if (program != nullptr && !castByPerson) {
+    casting.role = program->role;
+  } else if (entry != nullptr) {
+    casting.role = entry->role;
+  }
+  // Deeds and quirks are written for a program in its own role.
+  if (casting.program != nullptr && casting.program->role != casting.role) casting.program = nullptr;
+  return casting;
+}
+
+}  // namespace
+
+Casting castPlayer(std::string_view desktopEntry, std::string_view busName) {
+  const Entry* const entry = entryByID(desktopEntry);
+  const Program* program = programByBusName(busName);
+  if (program == nullptr) program = programByEntry(desktopEntry);
+  if (entry != nullptr || program == nullptr) return decide(entry, program, isBystander(busName));
+  return decide(entryByID(program->entry), program, isBystander(busName));
+}
+
+Casting castWindow(std::string_view applicationID, std::string_view instanceName,
+                   std::string_view className) {
+  const Entry* entry = entryByID(applicationID);
+  const Program* program = programByEntry(applicationID);
+  for (const std::string_view name : {className, instanceName}) {
+    if (entry == nullptr) entry = entryByWindowClass(name);
+    if (program == nullptr) program = programByWindowClass(name);
+  }
+  if (program == nullptr && entry != nullptr) program = programByEntry(entry->id);
+  if (entry == nullptr && program != nullptr) entry = entryByID(program->entry);
+  return decide(entry, program, false);
+}
+
+}  // namespace desktop

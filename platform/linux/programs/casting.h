@@ -1,0 +1,26 @@
+// Who plays which role: what a program tells of itself against the person's wish, the table of well-known
+// programs, and the categories of its desktop entry, in this order.
+#pragma once
+
+#include <string>
+#include <string_view>
+
+#include "platform/linux/programs/table.h"
+
+namespace desktop {
+
+struct Casting {
+  Role role = Role::None;
+  /// Null for a program that is not in the table.
+  const Program* program = nullptr;
+  /// The desktop entry without ".desktop"; empty where none was found.
+  std::string entry;
+};
+
+/// The role of a player on the bus, by the entry that it names and its bus name after the common prefix.
+Casting castPlayer(std::string_view desktopEntry, std::string_view busName);
+
+/// The role of a window, by its application id and both parts of its class.
+Casting castWindow(std::string_view applicationID, std::string_view instanceName, std::string_view className);
+
+}  // namespace desktop

@@ -1,0 +1,69 @@
+#include "platform/linux/roles/additions.h"
+
+#include <map>
+#include <memory>
+
+#include "platform/linux/sound/sound.h"
+#include "platform/scripting/additions_dictionary.h"
+
+namespace desktop {
+
+namespace {
+
+namespace words = scripting::additions;
+using tarnscript::Code;
+using tarnscript::ObjectRef;
+using tarnscript::Value;
+
+[[noreturn]] void refuse() { throw tarnscript::Refusal{"this is no command of the desktop"}; }
+
+void require(bool done) {
+  if (!done) throw tarnscript::Refusal{"the sound server does not answer"};
+}
+
+/// It always runs, and has commands and nothing else.
+class Additions final : public tarnscript::Application {
+ public:
+  const tarnscript::Dictionary& dictionary() const override { return words::dictionary(); }
+  bool running() const override { return true; }
+  void launch() override {}
+  void activate() override {}
+  void deliver(bool) override {}
+  Value get(const ObjectRef&, Code) override { refuse(); }
+  void set(const ObjectRef&, Code, const Value&) override { refuse(); }
+  std::vector<ObjectRef> elements(const ObjectRef&, Code) override { refuse(); }
+  ObjectRef elementWithID(const ObjectRef&, Code, const Value&) override { refuse(); }
+  Value perform(const tarnscript::Event& event) override;
+};
+
+Value volumeSettings() {
+  const auto state = soundState();
+  require(state.has_value());
+  return std::make_shared<const std::map<Code, Value>>(std::map<Code, Value>{
+      {words::kOutputVolume, std::int64_t{state->volume}},
+      {words::kOutputMuted, state->muted},
+  });
+}
+
+void setVolume(const std::map<Code, Value>& parameters) {
+  const auto volume = parameters.find(words::kOutputVolume);
+  if (volume != parameters.end()) require(setOutputVolume(tarnscript::toInt32(volume->second)));
+  const auto muted = parameters.find(words::kOutputMuted);
+  if (muted != parameters.end()) require(setOutputMuted(tarnscript::toInt32(muted->second) != 0));
+}
+
+Value Additions::perform(const tarnscript::Event& event) {
+  if (event.command == words::kGetVolumeSettings) return volumeSettings();
+  if (event.command != words::kSetVolume) refuse();
+  setVolume(event.parameters);
+  return {};
+}
+
+}  // namespace
+
+tarnscript::Application& additions() {
+  static Additions instance;
+  return instance;
+}
+
+}  // namespace desktop

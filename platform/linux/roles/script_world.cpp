@@ -1,0 +1,54 @@
+#include "platform/linux/roles/script_world.h"
+
+#include "platform/linux/roles/additions.h"
+#include "platform/linux/roles/role_application.h"
+#include "platform/scripting/script.h"
+#include "platform/tarnscript/text.h"
+
+namespace desktop {
+
+namespace {
+
+struct Row {
+  const char* identifier;
+  const char* name;
+  tarnscript::Application& (*application)();
+};
+
+constexpr Row kApplications[] = {
+    {"com.tarn.Lyrabox", "Lyrabox", jukebox},
+    {"com.tarn.Spindle", "Spindle", discPlayer},
+    {"com.tarn.vistremeplayer", "VistremePlayer", classicMovies},
+    {"com.tarn.VistremePlayerX", "VistremePlayerX", modernMovies},
+    {"com.tarn.Officra.Slidewell", "Slidewell", presentation},
+    {"com.tarn.Snapvale", "Snapvale", photoLibrary},
+    {"com.tarn.Keyhouse", "Keyhouse", keyhouse},
+};
+
+class World final : public tarnscript::World {
+ public:
+  tarnscript::Application* find(std::string_view identifierOrName) override;
+  tarnscript::Application& additions() override { return desktop::additions(); }
+};
+
+tarnscript::Application* World::find(std::string_view identifierOrName) {
+  for (const Row& row : kApplications) {
+    if (identifierOrName == row.identifier || identifierOrName == row.name) return &row.application();
+  }
+  for (const Row& row : kApplications) {
+    if (tarnscript::equalIgnoringCase(identifierOrName, row.identifier) ||
+        tarnscript::equalIgnoringCase(identifierOrName, row.name)) {
+      return &row.application();
+    }
+  }
+  return nullptr;
+}
+
+}  // namespace
+
+void letScriptsFindRoles() {
+  static World world;
+  scripting::setHooks({&world, nullptr, nullptr});
+}
+
+}  // namespace desktop

@@ -1,0 +1,50 @@
+#include "platform/linux/sound/sound_keys.h"
+
+#include <algorithm>
+#include <cstdint>
+
+#include "platform/linux/system/bus.h"
+#include "platform/linux/sound/sound.h"
+
+namespace desktop {
+
+namespace {
+
+constexpr int kStep = 5;  // points of the volume in percent
+
+const char* iconOf(const SoundState& sound) {
+  if (sound.muted || sound.volume == 0) return "audio-volume-muted-symbolic";
+  if (sound.volume <= 33) return "audio-volume-low-symbolic";
+  return sound.volume <= 66 ? "audio-volume-medium-symbolic" : "audio-volume-high-symbolic";
+}
+
+/// From version 41 on it obeys its own settings daemon alone and answers others with an error, which nobody
+/// waits for.
+bool showOnGnome(const SoundState& sound) {
+  constexpr char kName[] = "org.gnome.Shell";
+  if (!nameHasOwner(kName)) return false;
+  return send({kName}, {"/org/gnome/Shell", kName, "ShowOSD"}, "a{sv}", 2, "icon", "s", iconOf(sound),
+              "level", "d", sound.muted ? 0.0 : sound.volume / 100.0);
+}
+
+/// It shows 0 as muted.
+bool showOnPlasma(const SoundState& sound) {
+  constexpr char kName[] = "org.kde.plasmashell";
+  if (!nameHasOwner(kName)) return false;
+  return send({kName}, {"/org/kde/osdService", "org.kde.osdService", "volumeChanged"}, "i",
+              std::int32_t{sound.muted ? 0 : sound.volume});
+}
+
+}  // namespace
+
+void pressSoundKey(const base::SoundKey& key) {
+  if (!key.pressed) return;
+  auto sound = soundState();
+  if (!sound) return;
+  sound->volume = std::clamp(sound->volume + (key.louder ? kStep : -kStep), 0, 100);
+  if (!setOutputVolume(sound->volume)) return;
+  if (key.louder && sound->muted && setOutputMuted(false)) sound->muted = false;
+  if (!showOnGnome(*sound)) showOnPlasma(*sound);
+}
+
+}  // namespace desktop

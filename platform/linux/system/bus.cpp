@@ -1,0 +1,138 @@
+#include "platform/linux/system/bus.h"
+
+#include <cerrno>
+#include <chrono>
+#include <cstdint>
+#include <optional>
+
+#include "platform/base/run_loop.h"
+#include "platform/host.h"
+
+namespace desktop {
+
+namespace {
+
+const Callee kBusItself{"org.freedesktop.DBus", 0};
+
+sd_bus* sBus = nullptr;
+base::Owned<base::Source> sSource;
+unsigned sGeneration = 0;
+/// The turn in which a connection was last tried.
+std::optional<std::uint64_t> sTried;
+
+Microseconds now() {
+  using std::chrono::steady_clock;
+  return static_cast<Microseconds>(
+      std::chrono::duration_cast<std::chrono::microseconds>(steady_clock::now().time_since_epoch()).count());
+}
+
+void putOnLoop(sd_bus* connection) {
+  sSource = base::Owned<base::Source>(new base::Source(sd_bus_get_fd(connection), 0, takeInBus));
+  // What sd-bus has read while it waited for an answer no longer shows on the descriptor.
+  sSource->prepare = [connection] {
+    std::uint64_t timeout = 0;
+    return sd_bus_get_timeout(connection, &timeout) >= 0 && timeout <= now();
+  };
+  HostRunLoopAddSource(HostRunLoopCurrent(), HostSourceRef(sSource.get()), HostRunLoopMode::Default);
+}
+
+void loseConnection() {
+  if (sSource != nullptr) {
+    HostRunLoopRemoveSource(HostRunLoopCurrent(), HostSourceRef(sSource.get()), HostRunLoopMode::Default);
+    sSource.reset();
+  }
+  sBus = sd_bus_close_unref(sBus);
+}
+
+/// Waits until the bus has let us in; sd-bus itself would wait for ever.
+bool becomesReady(sd_bus* connection) {
+  const Microseconds deadline = now() + kCommandLimit;
+  while (sd_bus_is_ready(connection) == 0) {
+    const int done = sd_bus_process(connection, nullptr);
+    if (done < 0) return false;
+    if (done > 0) continue;
+    const Microseconds present = now();
+    if (present >= deadline || sd_bus_wait(connection, deadline - present) < 0) return false;
+  }
+  return sd_bus_is_ready(connection) > 0;
+}
+
+void connect() {
+  sd_bus* connection = nullptr;
+  if (sd_bus_open_user(&connection) < 0) return;
+  if (!becomesReady(connection)) {
+    sd_bus_close_unref(connection);
+    return;
+  }
+  sBus = connection;
+  ++sGeneration;
+  putOnLoop(connection);
+}
+
+}  // namespace
+
+sd_bus* bus() {
+  if (sBus != nullptr && sd_bus_is_open(sBus) <= 0) loseConnection();
+  if (sBus == nullptr && sTried != base::turn()) {
+    sTried = base::turn();
+    connect();
+  }
+  return sBus;
+}
+
+unsigned busGeneration() { return sGeneration; }
+
+void takeInBus() {
+  if (sBus == nullptr) return;
+  int done = 0;
+  do {
+    done = sd_bus_process(sBus, nullptr);
+  } while (done > 0);
+  // Busy means that this was called from a handler of a message, which the caller up there goes on with.
+  if (done < 0 && done != -EBUSY) loseConnection();
+}
+
+Message makeCall(const Callee& callee, const Method& method) {
+  sd_bus* const connection = bus();
+  sd_bus_message* request = nullptr;
+  if (connection == nullptr ||
+      sd_bus_message_new_method_call(connection, &request, callee.name.c_str(), method.path, method.interface,
+                                     method.member) < 0) {
+    return nullptr;
+  }
+  sd_bus_message_set_auto_start(request, 0);
+  return Message(request);
+}
+
+Message call(const Callee& callee, Message request, Microseconds limit) {
+  if (request == nullptr || timedOutThisTurn(callee.process)) return nullptr;
+  sd_bus_message* answer = nullptr;
+  const int result =
+      sd_bus_call(sd_bus_message_get_bus(request.get()), request.get(), limit, nullptr, &answer);
+  if (result == -ETIMEDOUT) noteTimeout(callee.process);
+  return Message(result < 0 ? nullptr : answer);
+}
+
+bool send(Message request) {
+  if (request == nullptr) return false;
+  sd_bus_message_set_expect_reply(request.get(), 0);
+  return sd_bus_send(nullptr, request.get(), nullptr) >= 0;
+}
+
+bool nameHasOwner(const char* name) {
+  const Message answer = call(kBusItself, {"/org/freedesktop/DBus", "org.freedesktop.DBus", "NameHasOwner"},
+                              kQueryLimit, "s", name);
+  int owned = 0;
+  return answer != nullptr && sd_bus_message_read(answer.get(), "b", &owned) > 0 && owned != 0;
+}
+
+pid_t processBehind(const char* name) {
+  const Message answer =
+      call(kBusItself, {"/org/freedesktop/DBus", "org.freedesktop.DBus", "GetConnectionUnixProcessID"},
+           kQueryLimit, "s", name);
+  std::uint32_t process = 0;
+  if (answer == nullptr || sd_bus_message_read(answer.get(), "u", &process) <= 0) return 0;
+  return static_cast<pid_t>(process);
+}
+
+}  // namespace desktop
