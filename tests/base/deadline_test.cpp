@@ -7,7 +7,7 @@
 
 #include <csignal>
 
-#include "platform/base/sockets.h"
+#include "platform/base/file_descriptor.h"
 
 namespace {
 
