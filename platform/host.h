@@ -159,6 +159,7 @@ using HostDisplayID = std::uint32_t;
 struct HostProcessSerialNumber {
   std::uint32_t high = 0;
   std::uint32_t low = 0;
+  friend constexpr bool operator==(const HostProcessSerialNumber&, const HostProcessSerialNumber&) = default;
 };
 
 /// The process's connection to the window server, 0 on failure.

@@ -4,6 +4,7 @@
 #include "platform/base/port_names.h"
 #include "platform/base/receive_queue.h"
 #include "platform/base/service_socket.h"
+#include "platform/base/sockets.h"
 
 namespace base {
 namespace {

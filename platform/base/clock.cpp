@@ -10,7 +10,7 @@
 #include <ctime>
 #include <utility>
 
-#include "platform/base/sockets.h"
+#include "platform/base/file_descriptor.h"
 
 namespace base {
 namespace {

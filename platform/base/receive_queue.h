@@ -8,7 +8,7 @@
 #include <optional>
 #include <vector>
 
-#include "platform/base/sockets.h"
+#include "platform/base/file_descriptor.h"
 #include "platform/mach.h"
 
 namespace base {

@@ -13,6 +13,7 @@
 
 #include "platform/base/port_names.h"
 #include "platform/base/service_directory.h"
+#include "platform/base/sockets.h"
 
 namespace {
 

@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "platform/base/service_directory.h"
+#include "platform/base/sockets.h"
 
 namespace base {
 namespace {

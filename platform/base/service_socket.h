@@ -2,7 +2,7 @@
 
 #include <string_view>
 
-#include "platform/base/sockets.h"
+#include "platform/base/file_descriptor.h"
 #include "platform/mach.h"
 
 namespace base {

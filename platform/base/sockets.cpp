@@ -1,15 +1,10 @@
 #include "platform/base/sockets.h"
 
 #include <sys/socket.h>
-#include <unistd.h>
 
 #include <cerrno>
 
 namespace base {
-
-FileDescriptor::~FileDescriptor() {
-  if (descriptor_ >= 0) close(descriptor_);
-}
 
 FileDescriptor datagramSocket() {
   return FileDescriptor(socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0));

@@ -20,10 +20,6 @@ namespace stage {
 
 namespace {
 
-bool sameProcess(const HostProcessSerialNumber& a, const HostProcessSerialNumber& b) {
-  return a.high == b.high && a.low == b.low;
-}
-
 bool equalIgnoringCase(std::string_view a, std::string_view b) {
   return a.size() == b.size() && strncasecmp(a.data(), b.data(), a.size()) == 0;
 }
@@ -82,7 +78,7 @@ Application* findOrInstallApplication(std::string_view identifierOrName) {
 const Process* findProcess(const HostProcessSerialNumber& serialNumber) {
   const auto& running = desktop().running;
   const auto found = std::find_if(running.begin(), running.end(), [&](const Process& process) {
-    return sameProcess(process.serialNumber, serialNumber);
+    return process.serialNumber == serialNumber;
   });
   return found != running.end() ? &*found : nullptr;
 }
@@ -102,11 +98,10 @@ void quitApplication(Application& application) {
   if (application.instances.empty()) return;
   const HostProcessSerialNumber oldest = application.instances.front();
   application.instances.erase(application.instances.begin());
-  std::erase_if(desktop().running,
-                [&](const Process& process) { return sameProcess(process.serialNumber, oldest); });
+  std::erase_if(desktop().running, [&](const Process& process) { return process.serialNumber == oldest; });
   ++desktop().applicationListSeed;
   record(Entry::Change, application.name + " quits");
-  if (desktop().front && sameProcess(desktop().front->serialNumber, oldest)) desktop().front.reset();
+  if (desktop().front && desktop().front->serialNumber == oldest) desktop().front.reset();
   if (!application.instances.empty()) return;
   application.ended();
   giveDisplayBack(application);
@@ -115,7 +110,7 @@ void quitApplication(Application& application) {
 void bringToFront(Application& application) {
   if (application.instances.empty()) return;
   const HostProcessSerialNumber oldest = application.instances.front();
-  if (desktop().front && sameProcess(desktop().front->serialNumber, oldest)) return;
+  if (desktop().front && desktop().front->serialNumber == oldest) return;
   desktop().front = Process{oldest, &application};
   record(Entry::Change, application.name + " comes to the front");
 }

@@ -9,8 +9,8 @@
 #include <ostream>
 #include <string>
 
+#include "platform/base/file_descriptor.h"
 #include "platform/base/run_loop.h"
-#include "platform/base/sockets.h"
 #include "platform/stage/commands.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/director.h"

@@ -14,6 +14,7 @@
 
 #include "platform/base/port_names.h"
 #include "platform/base/run_loop.h"
+#include "platform/base/sockets.h"
 #include "tests/base/temporary_directory.h"
 
 namespace {

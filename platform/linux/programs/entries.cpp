@@ -1,23 +1,23 @@
 #include "platform/linux/programs/entries.h"
 
-#include <fcntl.h>
-#include <poll.h>
-#include <spawn.h>
 #include <sys/stat.h>
-#include <sys/wait.h>
 #include <unistd.h>
 
 #include <algorithm>
-#include <cerrno>
 #include <chrono>
-#include <csignal>
 #include <cstdlib>
 #include <filesystem>
 #include <optional>
 #include <system_error>
+#include <utility>
 
+<<<<<<< HEAD:platform/linux/programs/entries.cpp
 #include "platform/base/sockets.h"
 #include "platform/linux/programs/entry_records.h"
+=======
+#include "platform/base/subprocess.h"
+#include "platform/linux/entry_records.h"
+>>>>>>> 82ed11e:platform/linux/entries.cpp
 #include "platform/tarnscript/text.h"
 
 namespace desktop {
@@ -39,66 +39,14 @@ std::string readerPath() {
   return directory / KVD_LIBEXEC_FROM_BIN / "kvd-entries";
 }
 
-/// Everything that comes out of the descriptor until it ends; nothing when that takes too long.
-std::optional<std::string> readToEnd(int input) {
-  using Clock = std::chrono::steady_clock;
-  const auto deadline = Clock::now() + kReadingLimit;
-  std::string text;
-  char buffer[4096];
-  while (text.size() < kLongestReport) {
-    const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(deadline - Clock::now());
-    pollfd ready{input, POLLIN, 0};
-    if (left.count() <= 0 || poll(&ready, 1, static_cast<int>(left.count())) == 0) return std::nullopt;
-    const ssize_t count = read(input, buffer, sizeof buffer);
-    if (count == 0) return text;
-    if (count < 0 && errno != EINTR) return std::nullopt;
-    if (count > 0) text.append(buffer, static_cast<std::size_t>(count));
-  }
-  return std::nullopt;
-}
-
-/// Starts the reader with its output in `output`. 0 when it could not be started.
-pid_t startReader(const char* option, int output) {
-  posix_spawn_file_actions_t files;
-  posix_spawnattr_t attributes;
-  posix_spawn_file_actions_init(&files);
-  posix_spawnattr_init(&attributes);
-  posix_spawn_file_actions_adddup2(&files, output, STDOUT_FILENO);
-  // This process blocks the signals that end it and ignores SIGPIPE; both would be inherited.
-  sigset_t none;
-  sigset_t pipes;
-  sigemptyset(&none);
-  sigemptyset(&pipes);
-  sigaddset(&pipes, SIGPIPE);
-  posix_spawnattr_setsigmask(&attributes, &none);
-  posix_spawnattr_setsigdefault(&attributes, &pipes);
-  posix_spawnattr_setflags(&attributes, POSIX_SPAWN_SETSIGMASK | POSIX_SPAWN_SETSIGDEF);
-
-  const std::string path = readerPath();
-  char* const arguments[] = {const_cast<char*>(path.c_str()), const_cast<char*>(option), nullptr};
-  pid_t reader = 0;
-  if (posix_spawn(&reader, path.c_str(), &files, &attributes, arguments, environ) != 0) reader = 0;
-  posix_spawnattr_destroy(&attributes);
-  posix_spawn_file_actions_destroy(&files);
-  return reader;
-}
-
 /// What the reader says; nothing when it failed.
 std::optional<std::string> askReader(const char* option) {
-  int ends[2];
-  if (pipe2(ends, O_CLOEXEC) != 0) return std::nullopt;
-  const base::FileDescriptor output(ends[0]);
-  base::FileDescriptor input(ends[1]);
-  const pid_t reader = startReader(option, input.get());
-  input = base::FileDescriptor();
-  if (reader == 0) return std::nullopt;
-  std::optional<std::string> text = readToEnd(output.get());
-  if (!text) kill(reader, SIGKILL);
-  int status = 0;
-  while (waitpid(reader, &status, 0) < 0 && errno == EINTR) {
-  }
-  if (!WIFEXITED(status) || WEXITSTATUS(status) != 0) text.reset();
-  return text;
+  const std::string path = readerPath();
+  base::Subprocess reader{.path = path, .arguments = {path}};
+  if (option != nullptr) reader.arguments.emplace_back(option);
+  auto said = base::runToEnd(std::move(reader), kLongestReport, base::Deadline(kReadingLimit));
+  if (!said || said->status != 0) return std::nullopt;
+  return std::move(said->output);
 }
 
 std::vector<std::string> split(std::string_view text, char end) {

@@ -117,14 +117,10 @@ void addWindows(std::vector<Instance>& found) {
   }
 }
 
-bool sameProcess(const HostProcessSerialNumber& a, const HostProcessSerialNumber& b) {
-  return a.high == b.high && a.low == b.low;
-}
-
 bool sameList(const std::vector<Instance>& a, const std::vector<Instance>& b) {
   return std::is_permutation(
       a.begin(), a.end(), b.begin(), b.end(), [](const Instance& x, const Instance& y) {
-        return x.role == y.role && sameProcess(x.serialNumber, y.serialNumber) && x.owner == y.owner;
+        return x.role == y.role && x.serialNumber == y.serialNumber && x.owner == y.owner;
       });
 }
 
@@ -191,7 +187,7 @@ const Instance* firstInstance(Role role) {
 
 const Instance* findInstance(const HostProcessSerialNumber& serialNumber) {
   const auto found = std::find_if(sInstances.begin(), sInstances.end(), [&](const Instance& instance) {
-    return sameProcess(instance.serialNumber, serialNumber);
+    return instance.serialNumber == serialNumber;
   });
   return found != sInstances.end() ? &*found : nullptr;
 }

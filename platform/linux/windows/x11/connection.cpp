@@ -16,8 +16,8 @@
 #include <optional>
 #include <string_view>
 
+#include "platform/base/file_descriptor.h"
 #include "platform/base/run_loop.h"
-#include "platform/base/sockets.h"
 #include "platform/linux/system/turn.h"
 #include "platform/linux/windows/x11/display.h"
 
