@@ -17,7 +17,8 @@
 
 namespace {
 
-using desktop::Role;
+namespace programs = linux::programs;
+using programs::Role;
 
 constexpr const char* kCastKey = "X-Kvd-Application";
 constexpr const char* kMusicTypes[] = {"audio/mpeg", "audio/flac", "audio/x-vorbis+ogg"};
@@ -60,15 +61,15 @@ void describe(GDesktopAppInfo* info, std::string& report) {
   const std::string id = withoutSuffix(textOf(g_app_info_get_id(G_APP_INFO(info))));
   const bool cast = g_desktop_app_info_has_key(info, kCastKey) != FALSE;
   const OwnedText castAs(cast ? g_desktop_app_info_get_string(info, kCastKey) : nullptr);
-  const desktop::Program* const known = desktop::programByEntry(id);
+  const programs::Program* const known = programs::programByEntry(id);
   Role role =
       known != nullptr ? known->role : roleByCategories(textOf(g_desktop_app_info_get_categories(info)));
-  if (cast) role = desktop::roleOf(textOf(castAs.get()));
+  if (cast) role = programs::roleOf(textOf(castAs.get()));
   if (role == Role::None && !cast) return;
 
   const OwnedText directory(g_desktop_app_info_get_string(info, "Path"));
   const bool activatable = g_desktop_app_info_get_boolean(info, "DBusActivatable") != FALSE;
-  const auto put = [&](const std::string& field) { report.append(field).push_back(desktop::kFieldEnd); };
+  const auto put = [&](const std::string& field) { report.append(field).push_back(programs::kFieldEnd); };
   put(id);
   put(textOf(g_desktop_app_info_get_startup_wm_class(info)));
   put(std::to_string(static_cast<int>(role)));
@@ -88,7 +89,7 @@ void describe(GDesktopAppInfo* info, std::string& report) {
     }
     g_strfreev(arguments);
   }
-  report.push_back(desktop::kRecordEnd);
+  report.push_back(programs::kRecordEnd);
 }
 
 std::string reportEntries() {
@@ -112,8 +113,8 @@ std::string reportDefaultMusicPlayer() {
 
 int main(int argc, char** argv) {
   const std::string_view option = argc == 2 ? argv[1] : "";
-  if (argc > 2 || (argc == 2 && option != desktop::kDefaultMusicPlayerOption)) {
-    std::fprintf(stderr, "Usage: kvd-entries [%s]\n", desktop::kDefaultMusicPlayerOption);
+  if (argc > 2 || (argc == 2 && option != programs::kDefaultMusicPlayerOption)) {
+    std::fprintf(stderr, "Usage: kvd-entries [%s]\n", programs::kDefaultMusicPlayerOption);
     return 2;
   }
   const std::string report = option.empty() ? reportEntries() : reportDefaultMusicPlayer();

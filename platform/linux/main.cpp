@@ -1,12 +1,12 @@
 #include "daemon/lifecycle.h"
-#include "platform/base/port_names.h"
 #include "platform/base/run_loop.h"
-#include "platform/linux/system/bus.h"
-#include "platform/linux/roles/script_world.h"
+#include "platform/linux/host/host.h"
+#include "platform/linux/windows/x11/x11.h"
 
 int main() {
   base::endLoopOnSignals();
-  base::bootstrapIsThere = [] { return desktop::bus() != nullptr; };
-  desktop::letScriptsFindRoles();
-  return KVDMain();
+  linux::host::init({&linux::windows::x11::kBackend});
+  const int status = KVDMain();
+  linux::host::finish();
+  return status;
 }

@@ -10,8 +10,9 @@
 
 namespace {
 
-using desktop::Instance;
-using desktop::Role;
+namespace programs = linux::programs;
+using programs::Instance;
+using programs::Role;
 
 /// Photo programs are spoken to in the words of this generation, which asks whether a slide show runs.
 constexpr const char* kPhotoLibraryVersion = "8.0";
@@ -27,7 +28,7 @@ constexpr std::int32_t kNotUnderstood = -1708;
 /// One value of a program's information, owned; null for an unknown key.
 HostObject* copyInformation(const Instance& instance, HostStringRef key) {
   if (HostStringsAreEqual(key, HostGetBundleIdentifierKey())) {
-    return new base::String(desktop::bundleIdentifier(instance.role));
+    return new base::String(programs::bundleIdentifier(instance.role));
   }
   if (HostStringsAreEqual(key, HostGetBundleVersionKey())) {
     return instance.role == Role::PhotoLibrary ? new base::String(kPhotoLibraryVersion) : nullptr;
@@ -51,30 +52,25 @@ bool matches(const Instance& instance, std::size_t count, const HostStringRef* k
 const Instance* instanceOf(HostSessionID session, HostSerialNumberRef serialNumber) {
   const auto* const number = base::as<base::SerialNumber>(serialNumber);
   if (session != kHostDefaultSession || number == nullptr) return nullptr;
-  return desktop::findInstance(number->process);
+  return programs::findInstance(number->process);
 }
-
-/// Every role, so that the instances of each come in their own order.
-constexpr Role kRoles[] = {
-    Role::Jukebox,      Role::DiscPlayer,   Role::ClassicMovies,      Role::ModernMovies,
-    Role::Presentation, Role::PhotoLibrary, Role::ProfessionalPhotos,
-};
 
 }  // namespace
 
 std::uint32_t HostGetApplicationListSeed(HostSessionID session) {
   if (session != kHostDefaultSession) return 0;
-  desktop::takeInDesktop();
-  return desktop::applicationListSeed();
+  programs::takeInDesktop();
+  return programs::applicationListSeed();
 }
 
 HostListRef HostFindRunningApplications(HostSessionID session, std::size_t count, const HostStringRef* keys,
                                         HostObject* const* values) {
   if (session != kHostDefaultSession) return nullptr;
-  desktop::takeInDesktop();
+  programs::takeInDesktop();
   std::vector<HostObject*> found;
-  for (const Role role : kRoles) {
-    for (const Instance* instance : desktop::instancesOf(role)) {
+  // Role by role, so that the instances of each come in their own order.
+  for (const Role role : programs::kRoles) {
+    for (const Instance* instance : programs::rankedInstances(role)) {
       if (matches(*instance, count, keys, values)) {
         found.push_back(new base::SerialNumber(instance->serialNumber));
       }
@@ -101,8 +97,8 @@ HostObject* HostCopyApplicationInformationItem(HostSessionID session, HostSerial
 
 HostSerialNumberRef HostCopyFrontApplication(HostSessionID session) {
   if (session != kHostDefaultSession) return nullptr;
-  desktop::takeInDesktop();
-  const Instance* const front = desktop::frontInstance();
+  programs::takeInDesktop();
+  const Instance* const front = programs::frontInstance();
   return front != nullptr ? HostSerialNumberRef(new base::SerialNumber(front->serialNumber)) : nullptr;
 }
 
@@ -110,10 +106,10 @@ std::int32_t HostSendEvent(const HostEventDescriptor* event, HostEventDescriptor
                            std::int32_t) {
   const auto target = base::targetOf(event);
   if (!target) return kBadEvent;
-  const Instance* const instance = desktop::findInstance(*target);
+  const Instance* const instance = programs::findInstance(*target);
   if (instance == nullptr) return kNoSuchProcess;
   const auto* const contents = base::as<base::EventContents>(event->contents);
   if (contents->eventClass != kHookClass || contents->eventID != kRemoteSelect) return kNotUnderstood;
-  desktop::bringToFront(*instance);
+  programs::bringToFront(*instance);
   return 0;
 }

@@ -6,13 +6,17 @@
 #include "platform/base/object.h"
 #include "platform/base/values.h"
 #include "platform/host.h"
+#include "platform/linux/programs/running.h"
+#include "platform/linux/roles/posted_keys.h"
 #include "platform/linux/system/bus.h"
 #include "platform/linux/windows/keysyms.h"
-#include "platform/linux/roles/posted_keys.h"
-#include "platform/linux/programs/running.h"
-#include "platform/linux/windows/x11/x11.h"
+#include "platform/linux/windows/windows.h"
 
 namespace {
+
+namespace programs = linux::programs;
+namespace roles = linux::roles;
+namespace windows = linux::windows;
 
 constexpr HostConnectionID kConnection = 1;
 constexpr std::int32_t kFailed = -1;
@@ -23,9 +27,9 @@ struct EventSource final : HostObject {
   EventSource() : HostObject(kKind) {}
   bool shiftIsDown = false;
   /// The window that took the last press and is owed the release; by then another may be the right one.
-  desktop::Window pressedIn = 0;
+  windows::ID pressedIn;
 
-  std::uint16_t modifiers() const { return shiftIsDown ? desktop::kShift : desktop::kNoModifier; }
+  windows::Modifiers modifiers() const { return shiftIsDown ? windows::kShift : windows::kNoModifier; }
 };
 
 struct KeyEvent final : HostObject {
@@ -40,7 +44,7 @@ struct KeyEvent final : HostObject {
 }  // namespace
 
 HostConnectionID HostConnectWindowServer() {
-  return desktop::bus() != nullptr || desktop::hasXServer() ? kConnection : 0;
+  return linux::system::bus() != nullptr || windows::isOpen() ? kConnection : 0;
 }
 
 std::int32_t HostSetLocalEventsSuppressionInterval(HostConnectionID connection, double) {
@@ -57,25 +61,25 @@ HostKeyEventRef HostCreateKeyboardEvent(HostEventSourceRef source, std::uint16_t
 
 void HostPostEventToProcess(const HostProcessSerialNumber& process, HostKeyEventRef event) {
   const auto* const key = base::as<KeyEvent>(event);
-  const desktop::Instance* const instance = desktop::findInstance(process);
+  const programs::Instance* const instance = programs::findInstance(process);
   if (key == nullptr || instance == nullptr) return;
   EventSource& source = *key->source;
-  if (key->virtualKey == desktop::kVirtualShift) {
+  if (key->virtualKey == windows::kVirtualShift) {
     source.shiftIsDown = key->down;
   } else if (key->down) {
-    source.pressedIn = desktop::pressKey(*instance, key->virtualKey, source.modifiers());
+    source.pressedIn = roles::pressKey(roles::Performer(*instance), key->virtualKey, source.modifiers());
   } else {
-    desktop::releaseKey(source.pressedIn, key->virtualKey, source.modifiers());
-    source.pressedIn = 0;
+    roles::releaseKey(source.pressedIn, key->virtualKey, source.modifiers());
+    source.pressedIn = {};
   }
 }
 
 std::int32_t HostFindProcessByBundleIdentifier(HostStringRef bundleIdentifier, std::uint32_t,
                                                HostProcessSerialNumber* process, std::uint8_t* found) {
   *found = 0;
-  desktop::takeInDesktop();
-  const desktop::Role role = desktop::roleOf(base::textOf(bundleIdentifier));
-  const desktop::Instance* const first = role != desktop::Role::None ? desktop::firstInstance(role) : nullptr;
+  programs::takeInDesktop();
+  const programs::Role role = programs::roleOf(base::textOf(bundleIdentifier));
+  const programs::Instance* const first = programs::firstInstance(role);
   if (first == nullptr) return 0;
   *process = first->serialNumber;
   *found = 1;
@@ -84,13 +88,13 @@ std::int32_t HostFindProcessByBundleIdentifier(HostStringRef bundleIdentifier, s
 
 std::int32_t HostGetActiveDisplayList(std::uint32_t capacity, HostDisplayID* displays, std::uint32_t* count) {
   *count = 0;
-  desktop::takeInDesktop();
-  const std::vector<desktop::Output> outputs = desktop::outputs();
+  programs::takeInDesktop();
+  const std::vector<windows::Output> outputs = windows::outputs();
   if (outputs.empty()) return kFailed;
   *count = static_cast<std::uint32_t>(std::min<std::size_t>(capacity, outputs.size()));
   std::transform(outputs.begin(), outputs.begin() + *count, displays,
-                 [](const desktop::Output& output) { return output.id; });
+                 [](const windows::Output& output) { return output.id; });
   return 0;
 }
 
-std::uint32_t HostDisplayIsCaptured(HostDisplayID display) { return desktop::isCaptured(display) ? 1 : 0; }
+std::uint32_t HostDisplayIsCaptured(HostDisplayID display) { return windows::isCaptured(display) ? 1 : 0; }

@@ -77,14 +77,14 @@ bool append(sd_bus_message* message, const base::Dictionary* dictionary) {
   return sd_bus_message_close_container(message) >= 0;
 }
 
-desktop::Message newNotification() {
+linux::system::Message newNotification() {
   sd_bus_message* message = nullptr;
-  sd_bus* const connection = desktop::bus();
+  sd_bus* const connection = linux::system::bus();
   if (connection == nullptr || sd_bus_message_new_signal(connection, &message, "/com/tarn/kvd",
                                                          "com.tarn.kvd.Notifications", "Posted") < 0) {
     return nullptr;
   }
-  return desktop::Message(message);
+  return linux::system::Message(message);
 }
 
 }  // namespace
@@ -102,12 +102,12 @@ std::int32_t HostEnableServiceTransactions(std::int32_t setting, std::int64_t va
 /// A signal is sent at once, so that there is nothing to hurry.
 void HostPostDistributedNotification(HostStringRef name, HostStringRef object,
                                      HostDictionaryRef userInformation, bool) {
-  desktop::Message message = newNotification();
+  linux::system::Message message = newNotification();
   if (message == nullptr) return;
   if (sd_bus_message_append(message.get(), "ss", base::textOf(name).c_str(), base::textOf(object).c_str()) <
           0 ||
       !append(message.get(), base::as<base::Dictionary>(userInformation))) {
     return;
   }
-  desktop::send(std::move(message));
+  linux::system::send(std::move(message));
 }

@@ -1,13 +1,11 @@
 #include "platform/linux/players/gtk_actions.h"
 
-#include <algorithm>
 #include <string>
 #include <string_view>
 
 #include "platform/linux/system/bus.h"
-#include "platform/linux/windows/keystrokes.h"
 
-namespace desktop {
+namespace linux::players {
 
 namespace {
 
@@ -17,20 +15,19 @@ constexpr std::string_view kOfProgram = "app.";
 
 /// Where an action is, and what it is called there.
 struct Address {
-  Callee callee;
+  system::Callee callee;
   std::string path;
   std::string action;
 };
 
 /// Programs write what they like into their windows' properties: only a unique name and a well-formed path
 /// are used.
-std::optional<Address> addressOf(const Instance& instance, std::string_view action) {
+std::optional<Address> addressOf(const windows::Window& window, std::string_view action) {
   const bool ofWindow = action.starts_with(kOfWindow);
   if (!ofWindow && !action.starts_with(kOfProgram)) return std::nullopt;
-  const Window window = keyboardWindow(instance);
   Address address;
-  address.callee = {textProperty(window, "_GTK_UNIQUE_BUS_NAME"), instance.process};
-  address.path = textProperty(window, ofWindow ? "_GTK_WINDOW_OBJECT_PATH" : "_GTK_APPLICATION_OBJECT_PATH");
+  address.callee = {window.gtk.busName, window.process};
+  address.path = ofWindow ? window.gtk.windowPath : window.gtk.applicationPath;
   address.action = action.substr(kOfWindow.size());
   const std::string& name = address.callee.name;
   if (!name.starts_with(':') || sd_bus_service_name_is_valid(name.c_str()) <= 0) return std::nullopt;
@@ -40,31 +37,32 @@ std::optional<Address> addressOf(const Instance& instance, std::string_view acti
 
 bool activate(const Address& address) {
   // No parameter, no word of the platform (a time of the event, a start-up id).
-  return send(address.callee, {address.path.c_str(), kInterface, "Activate"}, "sava{sv}",
-              address.action.c_str(), 0, 0);
+  return system::send(address.callee, {address.path.c_str(), kInterface, "Activate"}, "sava{sv}",
+                      address.action.c_str(), 0, 0);
 }
 
 bool setState(const Address& address, bool state) {
-  return send(address.callee, {address.path.c_str(), kInterface, "SetState"}, "sva{sv}",
-              address.action.c_str(), "b", static_cast<int>(state), 0);
+  return system::send(address.callee, {address.path.c_str(), kInterface, "SetState"}, "sva{sv}",
+                      address.action.c_str(), "b", static_cast<int>(state), 0);
 }
 
 }  // namespace
 
-bool activateAction(const Instance& instance, const char* action) {
+bool activateAction(const windows::Window& window, const char* action) {
   const std::string_view text = action;
   const std::size_t sign = text.find('=');
-  const auto address = addressOf(instance, text.substr(0, sign));
+  const auto address = addressOf(window, text.substr(0, sign));
   if (!address) return false;
   return sign == std::string_view::npos ? activate(*address)
                                         : setState(*address, text.substr(sign + 1) == "true");
 }
 
-std::optional<bool> actionState(const Instance& instance, const char* action) {
-  const auto address = addressOf(instance, action);
+std::optional<bool> actionState(const windows::Window& window, const char* action) {
+  const auto address = addressOf(window, action);
   if (!address) return std::nullopt;
-  const Message answer = call(address->callee, {address->path.c_str(), kInterface, "Describe"}, kQueryLimit,
-                              "s", address->action.c_str());
+  const system::Message answer =
+      system::call(address->callee, {address->path.c_str(), kInterface, "Describe"}, system::kQueryLimit, "s",
+                   address->action.c_str());
   int state = 0;
   if (answer == nullptr || sd_bus_message_enter_container(answer.get(), 'r', "bgav") <= 0 ||
       sd_bus_message_skip(answer.get(), "bg") < 0 ||
@@ -75,4 +73,4 @@ std::optional<bool> actionState(const Instance& instance, const char* action) {
   return state != 0;
 }
 
-}  // namespace desktop
+}  // namespace linux::players

@@ -6,15 +6,15 @@
 
 #include <optional>
 
-#include "platform/linux/programs/running.h"
+#include "platform/linux/windows/window.h"
 
-namespace desktop {
+namespace linux::players {
 
 /// Activates an action and does not wait, as the answer says nothing; "win.NAME=true" and "win.NAME=false"
 /// bring an action with a boolean state into that state instead. False when the window exports no actions.
-bool activateAction(const Instance& instance, const char* action);
+bool activateAction(const windows::Window& window, const char* action);
 
 /// The state of an action with a boolean state. Nothing when there is no such action, or no answer.
-std::optional<bool> actionState(const Instance& instance, const char* action);
+std::optional<bool> actionState(const windows::Window& window, const char* action);
 
-}  // namespace desktop
+}  // namespace linux::players

@@ -4,19 +4,22 @@
 #include <charconv>
 
 #include "platform/base/utf8.h"
-#include "platform/host.h"
-#include "platform/linux/system/bus_values.h"
 #include "platform/linux/players/mpris_names.h"
-#include "platform/linux/programs/table.h"
+#include "platform/linux/system/bus_values.h"
 #include "platform/tarnscript/tarnscript.h"
 
-namespace desktop {
+namespace linux::players {
 
 namespace {
 
-/// How long a player may take to do what it has been told, in seconds. Until then the answer to a question
-/// may be older than the command.
-constexpr double kSettling = 0.5;
+using system::kCommandLimit;
+using system::kQueryLimit;
+using system::Message;
+using system::Method;
+using system::readBoolean;
+using system::readDictionary;
+using system::readNumber;
+using system::readText;
 
 /// Longer than anything that is played, in microseconds: times beyond it are garbage.
 constexpr double kLongestTime = 1e6 * 3600 * 1000;
@@ -33,8 +36,8 @@ constexpr std::string_view kNoTrack = "/org/mpris/MediaPlayer2/TrackList/NoTrack
 /// What a player refuses, it also answers late or not at all; which of them it was makes no difference here.
 Message ask(const Player& player, const char* member, const char* interface, const char* property = nullptr) {
   const Method method{mpris::kPath, mpris::kPropertiesInterface, member};
-  return property == nullptr ? call(player.callee, method, kQueryLimit, "s", interface)
-                             : call(player.callee, method, kQueryLimit, "ss", interface, property);
+  return property == nullptr ? system::call(player.callee, method, kQueryLimit, "s", interface)
+                             : system::call(player.callee, method, kQueryLimit, "ss", interface, property);
 }
 
 /// All properties at once. Asking for a single optional one ends some players.
@@ -111,7 +114,7 @@ void readProperty(sd_bus_message* message, std::string_view key, std::string_vie
 
 template <typename... Arguments>
 void command(Player& player, const Method& method, const char* types, Arguments... arguments) {
-  if (call(player.callee, method, kCommandLimit, types, arguments...) == nullptr) {
+  if (system::call(player.callee, method, kCommandLimit, types, arguments...) == nullptr) {
     refuse("the player cannot or will not");
   }
 }
@@ -121,16 +124,6 @@ void setProperty(Player& player, const char* interface, const char* property, co
                  Argument value) {
   command(player, {mpris::kPath, mpris::kPropertiesInterface, "Set"}, "ssv", interface, property, type,
           value);
-}
-
-void believe(Player& player, PlaybackStatus status) {
-  player.status.reset();
-  player.wish = Wish{status, HostAbsoluteTime() + kSettling};
-}
-
-std::optional<PlaybackStatus> believed(const Player& player) {
-  if (!player.wish || HostAbsoluteTime() >= player.wish->until) return std::nullopt;
-  return player.wish->status;
 }
 
 /// Play and Pause toggle in some players, and Play starts the track over in others: only a player whose
@@ -145,11 +138,6 @@ void bringTo(Player& player, PlaybackStatus wanted, const char* member) {
   }
 }
 
-std::uint8_t quirksOf(const Player& player) {
-  const Program* const program = programByBusName(player.name);
-  return program != nullptr ? program->quirks : std::uint8_t{kNoQuirk};
-}
-
 }  // namespace
 
 PlayerState stateOf(Player& player) {
@@ -159,13 +147,12 @@ PlayerState stateOf(Player& player) {
   readDictionary(answer.get(), [&](std::string_view key, std::string_view type) {
     readProperty(answer.get(), key, type, state);
   });
-  state.status = believed(player).value_or(state.told);
+  state.status = believedCommand(player).value_or(state.told);
   return state;
 }
 
 PlaybackStatus statusOf(Player& player) {
-  if (player.status) return *player.status;
-  if (const auto status = believed(player)) return *status;
+  if (const auto status = believedStatus(player)) return *status;
   // Every player has this property.
   const Message answer = ask(player, "Get", mpris::kPlayerInterface, mpris::kPlaybackStatus);
   const char* text = nullptr;
@@ -206,7 +193,7 @@ void pause(Player& player) {
   if (statusOf(player) != PlaybackStatus::Playing) return;
   believe(player, PlaybackStatus::Paused);
   // Not waited for: the player that is about to start shall not be held up by those that make room for it.
-  if (!send(player.callee, {mpris::kPath, mpris::kPlayerInterface, "Pause"}, "")) {
+  if (!system::send(player.callee, {mpris::kPath, mpris::kPlayerInterface, "Pause"}, "")) {
     player.wish.reset();
     refuse("the player cannot be reached");
   }
@@ -246,7 +233,7 @@ void seekTo(Player& player, const PlayerState& state, std::int64_t position) {
 }
 
 bool takesRate(const Player& player, const PlayerState& state, double rate) {
-  return (quirksOf(player) & kIgnoresRate) == 0 && rate >= state.minimumRate && rate <= state.maximumRate;
+  return (player.quirks & kIgnoresRate) == 0 && rate >= state.minimumRate && rate <= state.maximumRate;
 }
 
 void setRate(Player& player, double rate) { setProperty(player, mpris::kPlayerInterface, "Rate", "d", rate); }
@@ -260,8 +247,8 @@ void setFullscreen(Player& player, bool fullscreen) {
 }
 
 void raise(Player& player) {
-  if ((quirksOf(player) & kIgnoresRaise) != 0) refuse("the player takes a Raise and stays where it is");
+  if ((player.quirks & kIgnoresRaise) != 0) refuse("the player takes a Raise and stays where it is");
   command(player, {mpris::kPath, mpris::kRootInterface, "Raise"}, "");
 }
 
-}  // namespace desktop
+}  // namespace linux::players

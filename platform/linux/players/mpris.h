@@ -1,64 +1,22 @@
-// Players on the session bus (MPRIS 2.2).
+// What a player tells and is told over the session bus (MPRIS 2.2).
 //
-// Signals keep the list of players. A player's playback status is taken from its signals once it has been
-// seen to send them, and asked for before that. Optional properties are read with GetAll, never with Get,
-// which makes some players end. Operations throw tarnscript::Refusal where the player cannot or will not.
+// A player's playback status is taken from its signals once it has been seen to send them, and asked for
+// before that. Optional properties are read with GetAll, never with Get, which makes some players end.
+// Operations throw tarnscript::Refusal where the player cannot or will not.
 #pragma once
 
 #include <cstdint>
-#include <list>
 #include <optional>
 #include <string>
 #include <vector>
 
-#include "platform/linux/system/bus.h"
+#include "platform/linux/players/players.h"
 
-namespace desktop {
-
-enum class PlaybackStatus : std::uint8_t { Playing, Paused, Stopped };
-
-/// The status that a command leads to: believed for a moment, as many players answer the command first and do
-/// it then, and some say that they are paused while they seek.
-struct Wish {
-  PlaybackStatus status;
-  /// On the clock of HostAbsoluteTime.
-  double until;
-};
-
-/// How far a player is with telling who it is.
-enum class Introduction : std::uint8_t {
-  Awaited,   ///< asked, and worth waiting for
-  Late,      ///< asked, and once waited for in vain
-  Refused,   ///< asked too early: its answer was an error
-  Complete,  ///< what it told is in
-};
-
-/// One owner of a name that begins with "org.mpris.MediaPlayer2.".
-struct Player {
-  /// The part of the well-known name after that prefix.
-  std::string name;
-  /// Its unique name, and the process behind it (that of the proxy for a sandboxed program).
-  Callee callee;
-  /// Without ".desktop"; empty where the player does not tell.
-  std::string desktopEntry;
-  Introduction introduction = Introduction::Refused;
-  /// As its last signal told; nothing while no signal has, and after a command of ours.
-  std::optional<PlaybackStatus> status;
-  std::optional<Wish> wish;
-  /// Its rate before it was made to play faster; nothing while it plays at its own.
-  std::optional<double> ownRate;
-};
-
-/// Takes in what the bus has sent. True when players came or went since the last call, or told their desktop
-/// entry. Waits for that once, for each player that has come.
-bool takeInPlayers();
-
-/// In the order in which they came to the bus. Addresses stay valid while a player is on the bus.
-std::list<Player>& players();
+namespace linux::players {
 
 /// Everything a player tells of itself at one moment. Times in microseconds, volume 1.0 is its full one.
 struct PlayerState {
-  /// As statusOf answers.
+  /// What the player is believed to do, as statusOf answers.
   PlaybackStatus status = PlaybackStatus::Stopped;
   /// As the player says at that moment, which it may take back.
   PlaybackStatus told = PlaybackStatus::Stopped;
@@ -111,4 +69,4 @@ void setVolume(Player& player, double volume);
 void setFullscreen(Player& player, bool fullscreen);
 void raise(Player& player);
 
-}  // namespace desktop
+}  // namespace linux::players

@@ -4,9 +4,9 @@
 #include <optional>
 #include <string_view>
 
-#include "platform/linux/players/mpris.h"
+#include "platform/linux/players/players.h"
 
-namespace desktop::mpris {
+namespace linux::players::mpris {
 
 /// How the bus names of all players begin, without the last dot, and with it.
 inline constexpr const char* kNamespace = "org.mpris.MediaPlayer2";
@@ -21,11 +21,6 @@ inline constexpr const char* kPropertiesInterface = "org.freedesktop.DBus.Proper
 inline constexpr const char* kPlaybackStatus = "PlaybackStatus";
 
 /// What a text of the property PlaybackStatus means; nothing for any other text.
-inline std::optional<PlaybackStatus> statusNamed(std::string_view text) {
-  if (text == "Playing") return PlaybackStatus::Playing;
-  if (text == "Paused") return PlaybackStatus::Paused;
-  if (text == "Stopped") return PlaybackStatus::Stopped;
-  return std::nullopt;
-}
+std::optional<PlaybackStatus> statusNamed(std::string_view text);
 
-}  // namespace desktop::mpris
+}  // namespace linux::players::mpris

@@ -1,19 +1,28 @@
-// Keeps the list of players: who has come to the bus and left it, who they say they are, and what status they
-// tell.
+#include "platform/linux/players/players.h"
 
 #include <algorithm>
 #include <charconv>
 #include <map>
 #include <utility>
 
-#include "platform/host.h"
-#include "platform/linux/system/bus_values.h"
-#include "platform/linux/players/mpris.h"
 #include "platform/linux/players/mpris_names.h"
+#include "platform/linux/system/bus_values.h"
 
-namespace desktop {
+namespace linux::players {
 
 namespace {
+
+using system::bus;
+using system::call;
+using system::Callee;
+using system::kQueryLimit;
+using system::Message;
+using system::readDictionary;
+using system::readText;
+
+/// How long a player may take to do what it has been told. Until then the answer to a question may be older
+/// than the command.
+constexpr std::chrono::milliseconds kSettling{500};
 
 /// A player for other players; its status is that of somebody who is on the list already.
 constexpr std::string_view kProxy = "playerctld";
@@ -29,12 +38,6 @@ bool sChanged = false;
 /// The connection that all this is known from.
 unsigned sGeneration = 0;
 
-Player* playerWithOwner(std::string_view owner) {
-  const auto found = std::find_if(sPlayers.begin(), sPlayers.end(),
-                                  [&](const Player& player) { return player.callee.name == owner; });
-  return found != sPlayers.end() ? &*found : nullptr;
-}
-
 /// The identifier of a desktop entry, as a player tells it; never a path.
 std::string entryFrom(std::string text) {
   constexpr std::string_view kSuffix = ".desktop";
@@ -44,7 +47,7 @@ std::string entryFrom(std::string text) {
 
 int takeIntroduction(sd_bus_message* answer, void*, sd_bus_error*) {
   const char* const sender = sd_bus_message_get_sender(answer);
-  Player* const player = sender != nullptr ? playerWithOwner(sender) : nullptr;
+  Player* const player = sender != nullptr ? findPlayer(sender) : nullptr;
   if (player == nullptr) return 0;
   if (sd_bus_message_is_method_error(answer, nullptr) != 0) {
     player->introduction = Introduction::Refused;
@@ -60,7 +63,8 @@ int takeIntroduction(sd_bus_message* answer, void*, sd_bus_error*) {
 
 /// Asks who it is, for as long as the player is there: one that is stopped answers when it is continued.
 void introduce(Player& player) {
-  const Message request = makeCall(player.callee, {mpris::kPath, mpris::kPropertiesInterface, "GetAll"});
+  const Message request =
+      system::makeCall(player.callee, {mpris::kPath, mpris::kPropertiesInterface, "GetAll"});
   if (request != nullptr && sd_bus_message_append(request.get(), "s", mpris::kRootInterface) >= 0 &&
       sd_bus_call_async(bus(), nullptr, request.get(), takeIntroduction, nullptr, UINT64_MAX) >= 0) {
     player.introduction = Introduction::Awaited;
@@ -69,10 +73,10 @@ void introduce(Player& player) {
 
 void arrive(const std::string& name, const std::string& owner) {
   sOwners[name] = owner;
-  if (playerWithOwner(owner) != nullptr) return;
+  if (findPlayer(owner) != nullptr) return;
   Player& player = sPlayers.emplace_back();
   player.name = name;
-  player.callee = {owner, processBehind(owner.c_str())};
+  player.callee = {owner, system::processBehind(owner.c_str())};
   sChanged = true;
   introduce(player);
 }
@@ -87,7 +91,7 @@ void leave(const std::string& name) {
   sChanged = true;
   if (other == sOwners.end()) {
     std::erase_if(sPlayers, [&](const Player& player) { return player.callee.name == owner; });
-  } else if (Player* const player = playerWithOwner(owner)) {
+  } else if (Player* const player = findPlayer(owner)) {
     player->name = other->first;
   }
 }
@@ -113,14 +117,14 @@ int takeOwnerChange(sd_bus_message* signal, void*, sd_bus_error*) {
 
 /// A status that comes while another one is wished for is from before the command.
 void takeStatus(Player& player, PlaybackStatus status) {
-  if (player.wish && player.wish->status != status && HostAbsoluteTime() < player.wish->until) return;
+  if (player.wish && player.wish->status != status && !player.wish->until.hasPassed()) return;
   player.status = status;
   player.wish.reset();
 }
 
 int takePropertyChange(sd_bus_message* signal, void*, sd_bus_error*) {
   const char* const sender = sd_bus_message_get_sender(signal);
-  Player* const player = sender != nullptr ? playerWithOwner(sender) : nullptr;
+  Player* const player = sender != nullptr ? findPlayer(sender) : nullptr;
   const char* interface = nullptr;
   if (player == nullptr || sd_bus_message_read(signal, "s", &interface) <= 0) return 0;
   readDictionary(signal, [&](std::string_view key, std::string_view type) {
@@ -169,7 +173,7 @@ void beginAnew() {
   sChanged = sChanged || !sPlayers.empty();
   sPlayers.clear();
   sOwners.clear();
-  sGeneration = busGeneration();
+  sGeneration = system::busGeneration();
   if (bus() == nullptr) return;
   const std::string arrivals = std::string("type='signal',sender='org.freedesktop.DBus',") +
                                "interface='org.freedesktop.DBus',member='NameOwnerChanged'," +
@@ -192,29 +196,47 @@ void awaitIntroductions() {
   for (Player& player : sPlayers) {
     if (player.introduction == Introduction::Refused) introduce(player);
   }
-  const double deadline = HostAbsoluteTime() + static_cast<double>(kQueryLimit) / 1e6;
+  const base::Deadline deadline(kQueryLimit);
   while (anyAwaited()) {
-    takeInBus();
-    const double left = deadline - HostAbsoluteTime();
-    if (!anyAwaited() || left <= 0 || bus() == nullptr) break;
-    if (sd_bus_wait(bus(), static_cast<Microseconds>(left * 1e6)) < 0) break;
+    system::takeInBus();
+    if (!anyAwaited() || !system::waitForBus(deadline)) break;
   }
   for (Player& player : sPlayers) {
     if (player.introduction != Introduction::Awaited) continue;
     player.introduction = Introduction::Late;
-    noteTimeout(player.callee.process);
+    system::noteTimeout(player.callee.process);
   }
 }
 
 }  // namespace
 
 bool takeInPlayers() {
-  if (bus() == nullptr || sGeneration != busGeneration()) beginAnew();
-  takeInBus();
+  if (bus() == nullptr || sGeneration != system::busGeneration()) beginAnew();
+  system::takeInBus();
   awaitIntroductions();
   return std::exchange(sChanged, false);
 }
 
-std::list<Player>& players() { return sPlayers; }
+std::list<Player>& list() { return sPlayers; }
 
-}  // namespace desktop
+Player* findPlayer(std::string_view owner) {
+  const auto found = std::find_if(sPlayers.begin(), sPlayers.end(),
+                                  [&](const Player& player) { return player.callee.name == owner; });
+  return found != sPlayers.end() ? &*found : nullptr;
+}
+
+std::optional<PlaybackStatus> believedCommand(const Player& player) {
+  if (!player.wish || player.wish->until.hasPassed()) return std::nullopt;
+  return player.wish->status;
+}
+
+std::optional<PlaybackStatus> believedStatus(const Player& player) {
+  return player.status ? player.status : believedCommand(player);
+}
+
+void believe(Player& player, PlaybackStatus status) {
+  player.status.reset();
+  player.wish = Wish{status, base::Deadline(kSettling)};
+}
+
+}  // namespace linux::players

@@ -8,7 +8,7 @@
 #include "platform/host.h"
 #include "platform/tarnscript/tarnscript.h"
 
-namespace desktop {
+namespace linux::players {
 
 namespace {
 
@@ -52,16 +52,9 @@ void end(std::list<Scan>::iterator scan) {
   sScans.erase(scan);
 }
 
-Player* playerOf(const Scan& scan) {
-  for (Player& player : players()) {
-    if (player.callee.name == scan.owner) return &player;
-  }
-  return nullptr;
-}
-
 /// One seek. False when the scan has come to an end.
 bool step(Scan& scan) {
-  Player* const player = playerOf(scan);
+  Player* const player = findPlayer(scan.owner);
   if (player == nullptr) return false;
   const PlayerState state = stateOf(*player);
   const bool strayedBefore = std::exchange(scan.strayed, state.told != scan.status);
@@ -126,4 +119,4 @@ std::optional<double> scanRate(const Player& player) {
   return present->rate;
 }
 
-}  // namespace desktop
+}  // namespace linux::players

@@ -8,7 +8,7 @@
 
 #include "platform/linux/players/mpris.h"
 
-namespace desktop {
+namespace linux::players {
 
 /// Begins scanning at a rate (times the normal speed, negative is backward), or goes on at another one.
 void scan(Player& player, double rate);
@@ -19,4 +19,4 @@ void endScan(Player& player);
 /// The rate asked for; nothing while the player is not scanning.
 std::optional<double> scanRate(const Player& player);
 
-}  // namespace desktop
+}  // namespace linux::players

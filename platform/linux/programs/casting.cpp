@@ -2,7 +2,7 @@
 
 #include "platform/linux/programs/entries.h"
 
-namespace desktop {
+namespace linux::programs {
 
 namespace {
 
@@ -21,7 +21,7 @@ Casting decide(const Entry* entry, const Program* program, bool bystander) {
   } else if (entry != nullptr) {
     casting.role = entry->role;
   }
-  // Deeds and quirks are written for a program in its own role.
+  // What its row says is written for a program in its own role.
   if (casting.program != nullptr && casting.program->role != casting.role) casting.program = nullptr;
   return casting;
 }
@@ -36,11 +36,10 @@ Casting castPlayer(std::string_view desktopEntry, std::string_view busName) {
   return decide(entryByID(program->entry), program, isBystander(busName));
 }
 
-Casting castWindow(std::string_view applicationID, std::string_view instanceName,
-                   std::string_view className) {
-  const Entry* entry = entryByID(applicationID);
-  const Program* program = programByEntry(applicationID);
-  for (const std::string_view name : {className, instanceName}) {
+Casting castWindow(const windows::Window& window) {
+  const Entry* entry = entryByID(window.applicationID);
+  const Program* program = programByEntry(window.applicationID);
+  for (const std::string_view name : {window.className, window.instanceName}) {
     if (entry == nullptr) entry = entryByWindowClass(name);
     if (program == nullptr) program = programByWindowClass(name);
   }
@@ -49,4 +48,4 @@ Casting castWindow(std::string_view applicationID, std::string_view instanceName
   return decide(entry, program, false);
 }
 
-}  // namespace desktop
+}  // namespace linux::programs

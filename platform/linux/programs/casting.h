@@ -6,8 +6,9 @@
 #include <string_view>
 
 #include "platform/linux/programs/table.h"
+#include "platform/linux/windows/window.h"
 
-namespace desktop {
+namespace linux::programs {
 
 struct Casting {
   Role role = Role::None;
@@ -21,6 +22,6 @@ struct Casting {
 Casting castPlayer(std::string_view desktopEntry, std::string_view busName);
 
 /// The role of a window, by its application id and both parts of its class.
-Casting castWindow(std::string_view applicationID, std::string_view instanceName, std::string_view className);
+Casting castWindow(const windows::Window& window);
 
-}  // namespace desktop
+}  // namespace linux::programs

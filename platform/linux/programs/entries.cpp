@@ -11,16 +11,11 @@
 #include <system_error>
 #include <utility>
 
-<<<<<<< HEAD:platform/linux/programs/entries.cpp
-#include "platform/base/sockets.h"
-#include "platform/linux/programs/entry_records.h"
-=======
 #include "platform/base/subprocess.h"
-#include "platform/linux/entry_records.h"
->>>>>>> 82ed11e:platform/linux/entries.cpp
+#include "platform/linux/programs/entry_records.h"
 #include "platform/tarnscript/text.h"
 
-namespace desktop {
+namespace linux::programs {
 
 namespace {
 
@@ -139,4 +134,4 @@ std::string defaultMusicPlayer() {
   return entry != nullptr && entry->role == Role::Jukebox ? entry->id : "";
 }
 
-}  // namespace desktop
+}  // namespace linux::programs

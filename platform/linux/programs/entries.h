@@ -8,9 +8,9 @@
 #include <string_view>
 #include <vector>
 
-#include "platform/linux/programs/table.h"
+#include "platform/linux/programs/role.h"
 
-namespace desktop {
+namespace linux::programs {
 
 /// An installed program that plays a role, by its entry or by the table of well-known programs.
 struct Entry {
@@ -40,4 +40,4 @@ const Entry* entryByWindowClass(std::string_view windowClass);
 /// The person's default program for music files, if it plays the jukebox's role; "" otherwise. Asked afresh.
 std::string defaultMusicPlayer();
 
-}  // namespace desktop
+}  // namespace linux::programs

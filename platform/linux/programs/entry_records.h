@@ -4,7 +4,7 @@
 // was cast, 1 where it can be started over the bus, directory, then the words of its command.
 #pragma once
 
-namespace desktop {
+namespace linux::programs {
 
 // Neither byte can stand in a desktop entry's value.
 inline constexpr char kFieldEnd = '\x1f';
@@ -13,4 +13,4 @@ inline constexpr char kRecordEnd = '\x1e';
 /// Asks for the identifier of the default music player instead.
 inline constexpr const char* kDefaultMusicPlayerOption = "--default-music-player";
 
-}  // namespace desktop
+}  // namespace linux::programs

@@ -12,19 +12,18 @@
 #include <string>
 #include <vector>
 
-#include "platform/linux/system/bus.h"
 #include "platform/linux/programs/entries.h"
+#include "platform/linux/programs/table.h"
+#include "platform/linux/system/bus.h"
 
-namespace desktop {
+namespace linux::programs {
 
 namespace {
-
-using Clock = std::chrono::steady_clock;
 
 /// A program that has not appeared by then never will, and may be started again.
 constexpr std::chrono::seconds kStartingLimit{20};
 
-const Callee kServiceManager{"org.freedesktop.systemd1", 0};
+const system::Callee kServiceManager{"org.freedesktop.systemd1", 0};
 
 /// What a program needs to find the session, given on where the service manager may not know it.
 constexpr const char* kSessionVariables[] = {"DISPLAY", "XAUTHORITY", "WAYLAND_DISPLAY",
@@ -63,10 +62,11 @@ std::string objectPath(const std::string& id) {
 bool startOverBus(const Entry& entry) {
   if (!entry.busActivatable) return false;
   const std::string path = objectPath(entry.id);
-  Message request = makeCall({entry.id, 0}, {path.c_str(), "org.freedesktop.Application", "Activate"});
+  system::Message request =
+      system::makeCall({entry.id, 0}, {path.c_str(), "org.freedesktop.Application", "Activate"});
   if (request == nullptr) return false;
   sd_bus_message_set_auto_start(request.get(), 1);
-  return sd_bus_message_append(request.get(), "a{sv}", 0) >= 0 && send(std::move(request));
+  return sd_bus_message_append(request.get(), "a{sv}", 0) >= 0 && system::send(std::move(request));
 }
 
 std::vector<std::string> sessionEnvironment() {
@@ -116,14 +116,15 @@ std::string unitName(const Entry& entry) {
         std::isalnum(static_cast<unsigned char>(character)) != 0 || character == '.' || character == '_';
     id += plain ? character : '_';
   }
-  return "app-kvd-" + id + "-" + std::to_string(Clock::now().time_since_epoch().count()) + ".service";
+  return "app-kvd-" + id + "-" + std::to_string(base::Clock::now().time_since_epoch().count()) + ".service";
 }
 
 /// As a transient unit of the service manager: outside our own unit, its confinement and its end.
 bool startAsUnit(const Entry& entry) {
-  if (!nameHasOwner(kServiceManager.name.c_str())) return false;
-  Message request = makeCall(kServiceManager, {"/org/freedesktop/systemd1",
-                                               "org.freedesktop.systemd1.Manager", "StartTransientUnit"});
+  if (!system::nameHasOwner(kServiceManager.name.c_str())) return false;
+  system::Message request = system::makeCall(
+      kServiceManager,
+      {"/org/freedesktop/systemd1", "org.freedesktop.systemd1.Manager", "StartTransientUnit"});
   if (request == nullptr) return false;
   sd_bus_message* const message = request.get();
   const std::string directory = entry.directory.empty() ? "~" : entry.directory;
@@ -135,7 +136,7 @@ bool startAsUnit(const Entry& entry) {
                             directory.c_str()) >= 0 &&
       appendTexts(message, "Environment", sessionEnvironment()) && appendCommand(message, entry.command) &&
       sd_bus_message_close_container(message) >= 0 && sd_bus_message_append(message, "a(sa(sv))", 0) >= 0;
-  return complete && call(kServiceManager, std::move(request), kCommandLimit) != nullptr;
+  return complete && system::call(kServiceManager, std::move(request), system::kCommandLimit) != nullptr;
 }
 
 [[noreturn]] void become(const Entry& entry) {
@@ -163,15 +164,14 @@ void startDetached(const Entry& entry) {
 }  // namespace
 
 void launchProgramOf(Role role) {
-  static std::map<Role, Clock::time_point> sStarting;
-  const Clock::time_point now = Clock::now();
+  static std::map<Role, base::Deadline> sStarting;
   const auto starting = sStarting.find(role);
-  if (starting != sStarting.end() && now - starting->second < kStartingLimit) return;
+  if (starting != sStarting.end() && !starting->second.hasPassed()) return;
   const Entry* const entry = defaultEntry(role);
   if (entry == nullptr) return;
-  sStarting[role] = now;
+  sStarting.insert_or_assign(role, base::Deadline(kStartingLimit));
   if (startOverBus(*entry) || entry->command.empty() || startAsUnit(*entry)) return;
   startDetached(*entry);
 }
 
-}  // namespace desktop
+}  // namespace linux::programs

@@ -1,119 +1,112 @@
 #include "platform/linux/programs/running.h"
 
 #include <algorithm>
-#include <fstream>
 #include <functional>
-#include <iterator>
-#include <sstream>
+#include <span>
 #include <string_view>
 
+#include "platform/base/run_loop.h"
+#include "platform/linux/players/mpris.h"
 #include "platform/linux/programs/casting.h"
+#include "platform/linux/system/process.h"
 #include "platform/tarnscript/tarnscript.h"
 #include "platform/tarnscript/text.h"
 
-namespace desktop {
+namespace linux::programs {
 
 namespace {
+
+using players::Player;
+using windows::Window;
 
 std::vector<Instance> sInstances;
 std::uint32_t sSeed = 1;
 
-/// When a process started, in ticks since the machine did (field 22 of /proc/PID/stat); 0 where it cannot be
-/// read.
-std::uint32_t startTime(pid_t process) {
-  constexpr int kFieldsBefore =
-      19;  // between the name, which may hold anything but ends with the last ')', and it
-  std::ifstream file("/proc/" + std::to_string(process) + "/stat");
-  const std::string text(std::istreambuf_iterator<char>(file), {});
-  const std::size_t end = text.rfind(')');
-  if (end == std::string::npos) return 0;
-  std::istringstream rest(text.substr(end + 1));
-  std::string field;
-  for (int i = 0; i < kFieldsBefore; ++i) rest >> field;
-  std::uint64_t ticks = 0;
-  rest >> ticks;
-  return static_cast<std::uint32_t>(ticks);
+/// The windows as they were cast: those of a suite with their class as it was then.
+std::vector<Window> sWindows;
+/// The turn in which those classes were last looked at.
+std::optional<std::uint64_t> sClassesRead;
+
+bool belongsTo(const Window& window, const Instance& instance) {
+  return window.process != 0 && window.process == instance.process;
 }
 
-bool belongsTo(const Client& client, const Instance& instance) {
-  return client.process != 0 && client.process == instance.process;
+bool anyBelongsTo(const Instance& instance) {
+  return std::ranges::any_of(sWindows, [&](const Window& window) { return belongsTo(window, instance); });
 }
 
-bool hasWindow(const Instance& instance, Window window) {
-  return std::find(instance.windows.begin(), instance.windows.end(), window) != instance.windows.end();
+/// A suite shows the documents of all its programs from one process: letters and sheets are not slides.
+bool showsOtherDocument(const Window& window, const Instance& instance) {
+  const Program* const program = instance.program;
+  return program != nullptr && *program->suite != '\0' && window.className.starts_with(program->suite) &&
+         !tarnscript::equalIgnoringCase(window.className, program->windowClass);
+}
+
+Instance instanceOf(Casting casting) {
+  Instance instance;
+  instance.role = casting.role;
+  instance.program = casting.program;
+  instance.entry = std::move(casting.entry);
+  return instance;
 }
 
 void addPlayers(std::vector<Instance>& found) {
-  for (const Player& player : players()) {
+  for (Player& player : players::list()) {
+    const Program* const known = programByBusName(player.name);
+    player.quirks = known != nullptr ? known->quirks : players::Quirks{players::kNoQuirk};
     Casting casting = castPlayer(player.desktopEntry, player.name);
     if (casting.role == Role::None) continue;
-    Instance instance;
-    instance.role = casting.role;
-    instance.program = casting.program;
-    instance.entry = std::move(casting.entry);
+    Instance& instance = found.emplace_back(instanceOf(std::move(casting)));
     instance.process = player.callee.process;
     instance.owner = player.callee.name;
-    found.push_back(std::move(instance));
   }
 }
 
-/// The player that a window belongs to although its process has another number: a sandboxed program speaks on
-/// the bus through a proxy.
-Instance* sandboxedPlayer(std::vector<Instance>& found, const Casting& casting) {
+/// Whom a window belongs to although no process says so, by their desktop entry: a player that speaks on the
+/// bus through the proxy of its sandbox, or a program whose windows do not tell their process.
+Instance* ownerByEntry(std::vector<Instance>& found, const Window& window, const Casting& casting) {
   const auto fits = [&](const Instance& instance) {
-    if (instance.owner.empty() || instance.entry.empty() || instance.entry != casting.entry) return false;
-    return std::none_of(clients().begin(), clients().end(),
-                        [&](const Client& client) { return belongsTo(client, instance); });
+    if (instance.entry.empty() || instance.entry != casting.entry || anyBelongsTo(instance)) return false;
+    return !instance.owner.empty() || (instance.process == 0 && window.process == 0);
   };
-  const auto player = std::find_if(found.begin(), found.end(), fits);
-  return player != found.end() ? &*player : nullptr;
+  const auto owner = std::ranges::find_if(found, fits);
+  return owner != found.end() ? &*owner : nullptr;
 }
 
 /// Makes sure that every program with a window in a role is there.
 void addPrograms(std::vector<Instance>& found) {
-  for (const Client& client : clients()) {
-    const auto known = std::any_of(found.begin(), found.end(),
-                                   [&](const Instance& instance) { return belongsTo(client, instance); });
-    if (known) continue;
-    const Casting casting = castWindow(client.applicationID, client.instanceName, client.className);
-    if (casting.role == Role::None) continue;
-    if (Instance* const player = sandboxedPlayer(found, casting)) {
-      player->process = client.process;
+  for (const Window& window : sWindows) {
+    if (std::ranges::any_of(found, [&](const Instance& instance) { return belongsTo(window, instance); })) {
       continue;
     }
-    Instance instance;
-    instance.role = casting.role;
-    instance.program = casting.program;
-    instance.entry = casting.entry;
-    instance.process = client.process;
-    if (client.process == 0) instance.windows.push_back(client.window);
-    found.push_back(std::move(instance));
+    Casting casting = castWindow(window);
+    if (casting.role == Role::None) continue;
+    Instance* owner = ownerByEntry(found, window, casting);
+    if (owner == nullptr) owner = &found.emplace_back(instanceOf(std::move(casting)));
+    if (window.process != 0) {
+      owner->process = window.process;
+    } else {
+      owner->windows.push_back(window.id);
+    }
   }
-}
-
-/// An office shows the documents of all its programs from one process: letters and sheets are not slides.
-bool showsOtherDocument(const Client& client, const Instance& instance) {
-  constexpr std::string_view kOffice = "libreoffice-";
-  return instance.program != nullptr && client.className.starts_with(kOffice) &&
-         !tarnscript::equalIgnoringCase(client.className, instance.program->windowClass);
 }
 
 /// What tells a program apart whose process nobody knows.
 std::uint32_t numberWithoutProcess(const Instance& instance) {
-  if (!instance.windows.empty()) return instance.windows.front();
+  if (!instance.windows.empty()) return static_cast<std::uint32_t>(instance.windows.front().number);
   return static_cast<std::uint32_t>(std::hash<std::string>()(instance.owner));
 }
 
 void addWindows(std::vector<Instance>& found) {
   for (Instance& instance : found) {
-    for (const Client& client : clients()) {
-      if (belongsTo(client, instance) && !showsOtherDocument(client, instance)) {
-        instance.windows.push_back(client.window);
+    for (const Window& window : sWindows) {
+      if (belongsTo(window, instance) && !showsOtherDocument(window, instance)) {
+        instance.windows.push_back(window.id);
       }
     }
     instance.serialNumber.low = static_cast<std::uint32_t>(instance.process);
     instance.serialNumber.high =
-        instance.process != 0 ? startTime(instance.process) : numberWithoutProcess(instance);
+        instance.process != 0 ? system::startTime(instance.process) : numberWithoutProcess(instance);
   }
 }
 
@@ -124,11 +117,27 @@ bool sameList(const std::vector<Instance>& a, const std::vector<Instance>& b) {
       });
 }
 
+/// Looks once a turn, as nothing tells, whether windows of a suite have another document in them. True when
+/// one has.
+bool readChangingClasses() {
+  if (sClassesRead == base::turn()) return false;
+  sClassesRead = base::turn();
+  bool changed = false;
+  for (Window& window : sWindows) {
+    if (!isOfSuite(window.className)) continue;
+    const auto looked = windows::look(std::span(&window.id, 1));
+    if (looked.empty() || looked.front().className == window.className) continue;
+    window.className = looked.front().className;
+    changed = true;
+  }
+  return changed;
+}
+
 bool plays(const Instance& instance) {
   Player* const player = playerOf(instance);
   if (player == nullptr) return false;
   try {
-    return statusOf(*player) == PlaybackStatus::Playing;
+    return statusOf(*player) == players::PlaybackStatus::Playing;
   } catch (const tarnscript::Refusal&) {
     return false;
   }
@@ -137,9 +146,14 @@ bool plays(const Instance& instance) {
 }  // namespace
 
 void takeInDesktop() {
-  const bool playersChanged = takeInPlayers();
-  const bool windowsChanged = takeInX();
-  if (!playersChanged && !windowsChanged) return;
+  const bool playersChanged = players::takeInPlayers();
+  const bool windowsChanged = windows::takeIn();
+  if (windowsChanged) {
+    sWindows = windows::list();
+    sClassesRead = base::turn();
+  }
+  const bool classesChanged = readChangingClasses();
+  if (!playersChanged && !windowsChanged && !classesChanged) return;
   std::vector<Instance> found;
   addPlayers(found);
   addPrograms(found);
@@ -152,7 +166,9 @@ std::uint32_t applicationListSeed() { return sSeed; }
 
 const std::vector<Instance>& instances() { return sInstances; }
 
-std::vector<const Instance*> instancesOf(Role role) {
+bool isPlayed(Role role) { return std::ranges::find(sInstances, role, &Instance::role) != sInstances.end(); }
+
+std::vector<const Instance*> rankedInstances(Role role) {
   struct Rank {
     bool inFront;
     bool plays;
@@ -165,51 +181,47 @@ std::vector<const Instance*> instancesOf(Role role) {
   }
   // Who plays may have to be asked for: only where there is something to choose.
   if (ranks.size() > 1) {
+    const Instance* const front = frontInstance();
     for (Rank& rank : ranks) {
       rank.plays = plays(*rank.instance);
-      rank.inFront = rank.instance == frontInstance();
+      rank.inFront = rank.instance == front;
     }
-    std::stable_sort(ranks.begin(), ranks.end(), [](const Rank& a, const Rank& b) {
+    std::ranges::stable_sort(ranks, [](const Rank& a, const Rank& b) {
       if (a.inFront != b.inFront) return a.inFront;
       if (a.plays != b.plays) return a.plays;
       return a.started > b.started;
     });
   }
   std::vector<const Instance*> ordered(ranks.size());
-  std::transform(ranks.begin(), ranks.end(), ordered.begin(), [](const Rank& rank) { return rank.instance; });
+  std::ranges::transform(ranks, ordered.begin(), &Rank::instance);
   return ordered;
 }
 
 const Instance* firstInstance(Role role) {
-  const auto ordered = instancesOf(role);
+  const auto ordered = rankedInstances(role);
   return ordered.empty() ? nullptr : ordered.front();
 }
 
 const Instance* findInstance(const HostProcessSerialNumber& serialNumber) {
-  const auto found = std::find_if(sInstances.begin(), sInstances.end(), [&](const Instance& instance) {
-    return instance.serialNumber == serialNumber;
-  });
+  const auto found = std::ranges::find(sInstances, serialNumber, &Instance::serialNumber);
   return found != sInstances.end() ? &*found : nullptr;
 }
 
 const Instance* frontInstance() {
-  const Window front = activeWindow();
-  if (front == 0) return nullptr;
-  const auto found = std::find_if(sInstances.begin(), sInstances.end(),
-                                  [&](const Instance& instance) { return hasWindow(instance, front); });
+  const Window* const front = windows::front();
+  if (front == nullptr) return nullptr;
+  const auto found = std::ranges::find_if(sInstances, [&](const Instance& instance) {
+    return std::ranges::find(instance.windows, front->id) != instance.windows.end();
+  });
   return found != sInstances.end() ? &*found : nullptr;
 }
 
 Player* playerOf(const Instance& instance) {
-  if (instance.owner.empty()) return nullptr;
-  for (Player& player : players()) {
-    if (player.callee.name == instance.owner) return &player;
-  }
-  return nullptr;
+  return instance.owner.empty() ? nullptr : players::findPlayer(instance.owner);
 }
 
 void bringToFront(const Instance& instance) {
-  if (!instance.windows.empty()) return activate(instance.windows.front());
+  if (!instance.windows.empty()) return windows::activate(instance.windows.front());
   Player* const player = playerOf(instance);
   if (player == nullptr) return;
   try {
@@ -219,4 +231,4 @@ void bringToFront(const Instance& instance) {
   }
 }
 
-}  // namespace desktop
+}  // namespace linux::programs

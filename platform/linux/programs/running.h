@@ -1,18 +1,19 @@
-// The programs that run and play a role: owners of MPRIS2 names and clients of the X server, merged.
+// The programs that run and play a role: owners of MPRIS2 names and of windows, merged.
 //
-// What the bus knows and what the X server knows of one program meet by its process; where a sandbox's proxy
-// hides that, by its desktop entry.
+// What the bus knows and what the window systems know of one program meet by its process; where that is
+// hidden, by its desktop entry.
 #pragma once
 
+#include <optional>
 #include <string>
 #include <vector>
 
 #include "platform/host.h"
-#include "platform/linux/players/mpris.h"
+#include "platform/linux/players/players.h"
 #include "platform/linux/programs/table.h"
-#include "platform/linux/windows/x11/x11.h"
+#include "platform/linux/windows/windows.h"
 
-namespace desktop {
+namespace linux::programs {
 
 /// One running program that plays a role.
 struct Instance {
@@ -28,10 +29,10 @@ struct Instance {
   /// Its player on the bus, by unique name; empty when it has none.
   std::string owner;
   /// Its windows, topmost first.
-  std::vector<Window> windows;
+  std::vector<windows::ID> windows;
 };
 
-/// Takes in what the bus and the X server have sent, and brings the list up to date.
+/// Takes in what the bus and the window systems have sent, and brings the list up to date.
 void takeInDesktop();
 
 /// Changes whenever the list does.
@@ -40,9 +41,11 @@ std::uint32_t applicationListSeed();
 /// In no particular order. Valid until takeInDesktop, as all that follow.
 const std::vector<Instance>& instances();
 
+/// Whether any program plays the role now.
+bool isPlayed(Role role);
 /// The instances of a role in the order that a person expects: the one in front, then those that play, then
-/// the others, each group with the one that was started last at its head.
-std::vector<const Instance*> instancesOf(Role role);
+/// the others, each group with the one that was started last at its head. May ask players what they do.
+std::vector<const Instance*> rankedInstances(Role role);
 /// The first of them; null when none runs.
 const Instance* firstInstance(Role role);
 /// Null when it has gone.
@@ -51,9 +54,9 @@ const Instance* findInstance(const HostProcessSerialNumber& serialNumber);
 const Instance* frontInstance();
 
 /// The player of an instance; null when it has none on the bus or has just left it.
-Player* playerOf(const Instance& instance);
+players::Player* playerOf(const Instance& instance);
 
-/// Asks the window manager, or the player where it has no window, to bring a program to the front.
+/// Asks for the topmost window, or the player where there is none, to come to the front.
 void bringToFront(const Instance& instance);
 
-}  // namespace desktop
+}  // namespace linux::programs

@@ -1,72 +1,179 @@
 #include "platform/linux/programs/table.h"
 
 #include <algorithm>
+#include <iterator>
 
+#include "platform/linux/programs/own_words.h"
+#include "platform/scripting/lyrabox_dictionary.h"
+#include "platform/scripting/movie_dictionaries.h"
+#include "platform/scripting/slidewell_dictionary.h"
+#include "platform/scripting/snapvale_dictionary.h"
+#include "platform/scripting/spindle_dictionary.h"
 #include "platform/tarnscript/text.h"
 
-namespace desktop {
+namespace linux::programs {
 
 namespace {
 
-struct RoleRow {
-  Role role;
-  const char* bundleIdentifier;
-};
+using players::ChannelKind;
+using players::kIgnoresRaise;
+using players::kIgnoresRate;
 
-constexpr RoleRow kRoles[] = {
-    {Role::Jukebox, "com.tarn.Lyrabox"},
-    {Role::DiscPlayer, "com.tarn.Spindle"},
-    {Role::ClassicMovies, "com.tarn.vistremeplayer"},
-    {Role::ModernMovies, "com.tarn.VistremePlayerX"},
-    {Role::Presentation, "com.tarn.Officra.Slidewell"},
-    {Role::PhotoLibrary, "com.tarn.Snapvale"},
-    {Role::ProfessionalPhotos, "com.tarn.Lumbra"},
-};
+namespace lyrabox = scripting::lyrabox;
+namespace movies = scripting::movies;
+namespace slidewell = scripting::slidewell;
+namespace snapvale = scripting::snapvale;
+namespace spindle = scripting::spindle;
 
-// clang-format off: one program a line. Within a role the first that is installed is the default.
+// Within a role the first that is installed is the default.
+// One program a row, its actions one a line below it.
+// clang-format off
 constexpr Program kPrograms[] = {
-    {Role::Jukebox, "Strawberry", "org.strawberrymusicplayer.strawberry", "strawberry", "strawberry",
-     kIgnoresRate},
-    {Role::Jukebox, "Rhythmbox", "org.gnome.Rhythmbox3", "rhythmbox", "rhythmbox", kIgnoresRate},
-    {Role::Jukebox, "Elisa", "org.kde.elisa", "elisa", "elisa", kIgnoresRate},
-    {Role::Jukebox, "Lollypop", "org.gnome.Lollypop", "Lollypop", "lollypop", kIgnoresRate},
-    {Role::Jukebox, "Amberol", "io.bassi.Amberol", "Amberol", "io.bassi.Amberol", kIgnoresRate},
-    {Role::Jukebox, "GNOME Music", "org.gnome.Music", "GnomeMusic", "org.gnome.Music", kIgnoresRate},
-    {Role::Jukebox, "Clementine", "org.clementine_player.Clementine", "clementine", "clementine",
-     kIgnoresRate},
-    {Role::Jukebox, "Quod Libet", "io.github.quodlibet.QuodLibet", "quodlibet", "quodlibet", kIgnoresRate},
-    {Role::Jukebox, "Audacious", "audacious", "audacious", "audacious", kIgnoresRate},
-    {Role::Jukebox, "DeaDBeeF", "deadbeef", "DeaDBeeF", "deadbeef", kIgnoresRate},
-    {Role::Jukebox, "Amarok", "org.kde.amarok", "amarok", "amarok", kIgnoresRate},
-    {Role::Jukebox, "JuK", "org.kde.juk", "juk", "juk", kIgnoresRate},
-    {Role::Jukebox, "Sayonara", "com.sayonara-player.Sayonara", "sayonara", "sayonara", kIgnoresRate},
-    {Role::Jukebox, "Exaile", "exaile", "exaile", "exaile", kIgnoresRate},
-    {Role::Jukebox, "Cantata", "org.kde.cantata", "cantata", "cantata", kIgnoresRate},
-    {Role::Jukebox, "Spotify", "spotify", "spotify", "spotify", kIgnoresRate},
-    {Role::Jukebox, "cmus", "cmus", "cmus", "", kIgnoresRate},
-    {Role::DiscPlayer, "VLC", "vlc", "vlc", "vlc", kIgnoresRaise},
-    {Role::ClassicMovies, "mpv", "mpv", "mpv", "mpv", kIgnoresRaise},
-    {Role::ClassicMovies, "SMPlayer", "smplayer", "smplayer", "smplayer", kNoQuirk},
-    {Role::ModernMovies, "Celluloid", "io.github.celluloid_player.Celluloid",
-     "io.github.celluloid_player.Celluloid", "celluloid", kNoQuirk},
-    {Role::ModernMovies, "Totem", "org.gnome.Totem", "totem", "totem", kNoQuirk},
-    {Role::ModernMovies, "Haruna", "org.kde.haruna", "haruna", "haruna", kNoQuirk},
-    {Role::ModernMovies, "Clapper", "com.github.rafostar.Clapper", "Clapper", "com.github.rafostar.Clapper",
-     kNoQuirk},
-    {Role::ModernMovies, "Showtime", "org.gnome.Showtime", "Showtime", "org.gnome.Showtime", kNoQuirk},
-    {Role::ModernMovies, "Dragon Player", "org.kde.dragonplayer", "dragonplayer", "dragonplayer", kNoQuirk},
-    {Role::ModernMovies, "Parole", "org.xfce.Parole", "parole", "parole", kNoQuirk},
-    {Role::Presentation, "LibreOffice Impress", "libreoffice-impress", "", "libreoffice-impress", kNoQuirk},
-    {Role::Presentation, "Evince", "org.gnome.Evince", "", "evince", kNoQuirk},
-    {Role::Presentation, "Okular", "org.kde.okular", "", "okular", kNoQuirk},
-    {Role::PhotoLibrary, "Eye of GNOME", "org.gnome.eog", "", "eog", kNoQuirk},
-    {Role::PhotoLibrary, "gThumb", "org.gnome.gThumb", "", "gthumb", kNoQuirk},
-    {Role::PhotoLibrary, "Gwenview", "org.kde.gwenview", "Gwenview", "gwenview", kNoQuirk},
-    {Role::PhotoLibrary, "Shotwell", "org.gnome.Shotwell", "", "shotwell", kNoQuirk},
-    {Role::PhotoLibrary, "Loupe", "org.gnome.Loupe", "", "org.gnome.Loupe", kNoQuirk},
-    {Role::ProfessionalPhotos, "darktable", "org.darktable.darktable", "", "darktable", kNoQuirk},
-    {Role::ProfessionalPhotos, "digiKam", "org.kde.digikam", "", "digikam", kNoQuirk},
-    {Role::ProfessionalPhotos, "RawTherapee", "rawtherapee", "", "rawtherapee", kNoQuirk},
+    {.role = Role::Jukebox, .name = "Strawberry", .entry = "org.strawberrymusicplayer.strawberry", .busName = "strawberry", .windowClass = "strawberry", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Rhythmbox", .entry = "org.gnome.Rhythmbox3", .busName = "rhythmbox", .windowClass = "rhythmbox", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Elisa", .entry = "org.kde.elisa", .busName = "elisa", .windowClass = "elisa", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Lollypop", .entry = "org.gnome.Lollypop", .busName = "Lollypop", .windowClass = "lollypop", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Amberol", .entry = "io.bassi.Amberol", .busName = "Amberol", .windowClass = "io.bassi.Amberol", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "GNOME Music", .entry = "org.gnome.Music", .busName = "GnomeMusic", .windowClass = "org.gnome.Music", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Clementine", .entry = "org.clementine_player.Clementine", .busName = "clementine", .windowClass = "clementine", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Quod Libet", .entry = "io.github.quodlibet.QuodLibet", .busName = "quodlibet", .windowClass = "quodlibet", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Audacious", .entry = "audacious", .busName = "audacious", .windowClass = "audacious", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "DeaDBeeF", .entry = "deadbeef", .busName = "DeaDBeeF", .windowClass = "deadbeef", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Amarok", .entry = "org.kde.amarok", .busName = "amarok", .windowClass = "amarok", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "JuK", .entry = "org.kde.juk", .busName = "juk", .windowClass = "juk", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Sayonara", .entry = "com.sayonara-player.Sayonara", .busName = "sayonara", .windowClass = "sayonara", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Exaile", .entry = "exaile", .busName = "exaile", .windowClass = "exaile", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Cantata", .entry = "org.kde.cantata", .busName = "cantata", .windowClass = "cantata", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Spotify", .entry = "spotify", .busName = "spotify", .windowClass = "spotify", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "cmus", .entry = "cmus", .busName = "cmus", .quirks = kIgnoresRate},
+
+    {.role = Role::DiscPlayer, .name = "VLC", .entry = "vlc", .busName = "vlc", .windowClass = "vlc", .quirks = kIgnoresRaise, .channel = ChannelKind::VlcRc, .executable = "vlc",
+     .actions = {{
+         {spindle::kGoToMainMenu, Means::Channel, "key key-disc-menu"},
+         {spindle::kGoToMainMenu, Means::Key, "Shift+m"},
+         {spindle::kPressUp, Means::Channel, "key key-nav-up"},
+         {spindle::kPressUp, Means::Key, "Up"},
+         {spindle::kPressDown, Means::Channel, "key key-nav-down"},
+         {spindle::kPressDown, Means::Key, "Down"},
+         {spindle::kPressLeft, Means::Channel, "key key-nav-left"},
+         {spindle::kPressLeft, Means::Key, "Left"},
+         {spindle::kPressRight, Means::Channel, "key key-nav-right"},
+         {spindle::kPressRight, Means::Key, "Right"},
+         {spindle::kPressEnter, Means::Channel, "key key-nav-activate"},
+         {spindle::kPressEnter, Means::Key, "Return"},
+         {words::kNextChapter, Means::Key, "Shift+n"},
+         {words::kPreviousChapter, Means::Key, "Shift+p"},
+     }}},
+
+    {.role = Role::ClassicMovies, .name = "mpv", .entry = "mpv", .busName = "mpv", .windowClass = "mpv", .quirks = kIgnoresRaise, .channel = ChannelKind::Mpv, .executable = "mpv",
+     .actions = {{
+         {movies::kStepForward, Means::Channel, "frame-step"},
+         {movies::kStepForward, Means::Key, "."},
+         {movies::kStepBackward, Means::Channel, "frame-back-step"},
+         {movies::kStepBackward, Means::Key, ","},
+     }}},
+    {.role = Role::ClassicMovies, .name = "SMPlayer", .entry = "smplayer", .busName = "smplayer", .windowClass = "smplayer"},
+
+    {.role = Role::ModernMovies, .name = "Celluloid", .entry = "io.github.celluloid_player.Celluloid", .busName = "io.github.celluloid_player.Celluloid", .windowClass = "celluloid", .channel = ChannelKind::Mpv, .executable = "celluloid"},
+    {.role = Role::ModernMovies, .name = "Totem", .entry = "org.gnome.Totem", .busName = "totem", .windowClass = "totem"},
+    {.role = Role::ModernMovies, .name = "Haruna", .entry = "org.kde.haruna", .busName = "haruna", .windowClass = "haruna"},
+    {.role = Role::ModernMovies, .name = "Clapper", .entry = "com.github.rafostar.Clapper", .busName = "Clapper", .windowClass = "com.github.rafostar.Clapper"},
+    {.role = Role::ModernMovies, .name = "Showtime", .entry = "org.gnome.Showtime", .busName = "Showtime", .windowClass = "org.gnome.Showtime"},
+    {.role = Role::ModernMovies, .name = "Dragon Player", .entry = "org.kde.dragonplayer", .busName = "dragonplayer", .windowClass = "dragonplayer"},
+    {.role = Role::ModernMovies, .name = "Parole", .entry = "org.xfce.Parole", .busName = "parole", .windowClass = "parole"},
+
+    {.role = Role::Presentation, .name = "LibreOffice Impress", .entry = "libreoffice-impress", .windowClass = "libreoffice-impress", .show = ShowStyle::OwnWindow, .suite = "libreoffice"},
+    {.role = Role::Presentation, .name = "Evince", .entry = "org.gnome.Evince", .windowClass = "evince",
+     .actions = {{
+         {slidewell::kStart, Means::Action, "win.presentation"},
+     }}},
+    {.role = Role::Presentation, .name = "Okular", .entry = "org.kde.okular", .windowClass = "okular", .show = ShowStyle::OwnWindow,
+     .actions = {{
+         {slidewell::kStart, Means::Method, "org.kde.okular-% /okular org.kde.okular slotTogglePresentation"},
+         {slidewell::kStart, Means::Key, "Control+Shift+p"},
+     }}},
+
+    {.role = Role::PhotoLibrary, .name = "Eye of GNOME", .entry = "org.gnome.eog", .windowClass = "eog", .show = ShowStyle::ActionState, .showAction = "win.view-slideshow",
+     .actions = {{
+         {snapvale::kStartSlideshow, Means::Action, "win.view-slideshow=true"},
+         {snapvale::kStopSlideshow, Means::Action, "win.view-slideshow=false"},
+         {words::kNextAlbum, Means::Action, "win.go-next"},
+         {words::kPreviousAlbum, Means::Action, "win.go-previous"},
+         {words::kSpace, Means::Action, "win.pause-slideshow"},
+         {words::kCommandEscape, Means::Action, "win.view-fullscreen"},
+     }}},
+    {.role = Role::PhotoLibrary, .name = "gThumb", .entry = "org.gnome.gThumb", .windowClass = "gthumb", .show = ShowStyle::OwnWindow,
+     .actions = {{
+         {snapvale::kStartSlideshow, Means::Action, "win.slideshow"},
+         {words::kNextAlbum, Means::Action, "win.show-next-image"},
+         {words::kPreviousAlbum, Means::Action, "win.show-previous-image"},
+         {words::kCommandEscape, Means::Action, "win.fullscreen"},
+     }}},
+    {.role = Role::PhotoLibrary, .name = "Gwenview", .entry = "org.kde.gwenview", .busName = "Gwenview", .windowClass = "gwenview",
+     .actions = {{
+         {snapvale::kStartSlideshow, Means::Mpris, "Play"},
+         {snapvale::kStopSlideshow, Means::Mpris, "Stop"},
+         {words::kNextAlbum, Means::Mpris, "Next"},
+         {words::kPreviousAlbum, Means::Mpris, "Previous"},
+         {words::kSpace, Means::Mpris, "PlayPause"},
+     }}},
+    {.role = Role::PhotoLibrary, .name = "Shotwell", .entry = "org.gnome.Shotwell", .windowClass = "shotwell", .show = ShowStyle::OwnWindow},
+    {.role = Role::PhotoLibrary, .name = "Loupe", .entry = "org.gnome.Loupe", .windowClass = "org.gnome.Loupe"},
+
+    {.role = Role::ProfessionalPhotos, .name = "darktable", .entry = "org.darktable.darktable", .windowClass = "darktable",
+     .actions = {{
+         {words::kShiftS, Means::Key, "s"},
+         {words::kReturn, Means::Key, "F11"},
+         {words::kEscape, Means::Key, "Escape F11"},
+     }}},
+    // Its show has begun when the second key comes.
+    {.role = Role::ProfessionalPhotos, .name = "digiKam", .entry = "org.kde.digikam", .windowClass = "digikam",
+     .actions = {{
+         {words::kShiftS, Means::Key, "F9"},
+         {words::kReturn, Means::Nothing},
+     }}},
+    // It has no shows, only the full screen, and nothing to pause.
+    {.role = Role::ProfessionalPhotos, .name = "RawTherapee", .entry = "rawtherapee", .windowClass = "rawtherapee",
+     .actions = {{
+         {words::kShiftS, Means::Key, "F11"},
+         {words::kReturn, Means::Nothing},
+         {words::kSpace, Means::Nothing},
+         {words::kEscape, Means::Key, "F11"},
+     }}},
+};
+
+constexpr Action kJukebox[] = {
+    {lyrabox::kNextTrack, Means::Mpris, "Next"},
+};
+
+constexpr Action kDiscPlayer[] = {
+    {spindle::kPressUp, Means::Key, "Up"},
+    {spindle::kPressDown, Means::Key, "Down"},
+    {spindle::kPressLeft, Means::Key, "Left"},
+    {spindle::kPressRight, Means::Key, "Right"},
+    {spindle::kPressEnter, Means::Key, "Return"},
+};
+
+constexpr Action kMovies[] = {
+    {movies::kClose, Means::Mpris, "Stop"},
+};
+
+constexpr Action kPresentation[] = {
+    {slidewell::kStart, Means::Key, "F5"},
+    {slidewell::kStop, Means::Key, "Escape"},
+    {slidewell::kShowNext, Means::Key, "Right"},
+    {slidewell::kShowPrevious, Means::Key, "Left"},
+    {words::kFirstSlide, Means::Key, "Home"},
+    {words::kLastSlide, Means::Key, "End"},
+    {words::kFreeze, Means::Key, "b"},
+};
+
+constexpr Action kPhotoLibrary[] = {
+    {snapvale::kStartSlideshow, Means::Key, "F5"},
+    {snapvale::kStopSlideshow, Means::Key, "Escape"},
+    {words::kNextAlbum, Means::Key, "Right"},
+    {words::kPreviousAlbum, Means::Key, "Left"},
+    {words::kCommandEscape, Means::Key, "F11"},
 };
 // clang-format on
 
@@ -102,20 +209,6 @@ std::string_view withoutInstance(std::string_view busName) {
 
 }  // namespace
 
-const char* bundleIdentifier(Role role) {
-  for (const RoleRow& row : kRoles) {
-    if (row.role == role) return row.bundleIdentifier;
-  }
-  return "";
-}
-
-Role roleOf(std::string_view identifier) {
-  for (const RoleRow& row : kRoles) {
-    if (row.bundleIdentifier == identifier) return row.role;
-  }
-  return Role::None;
-}
-
 std::span<const Program> programs() { return kPrograms; }
 
 const Program* programByEntry(std::string_view entry) { return programBy(&Program::entry, entry); }
@@ -128,9 +221,49 @@ const Program* programByWindowClass(std::string_view windowClass) {
   return programBy(&Program::windowClass, windowClass);
 }
 
+bool isOfSuite(std::string_view windowClass) {
+  return std::any_of(std::begin(kPrograms), std::end(kPrograms), [&](const Program& row) {
+    return *row.suite != '\0' && windowClass.starts_with(row.suite);
+  });
+}
+
 bool isBystander(std::string_view busName) {
   return std::any_of(std::begin(kBystanders), std::end(kBystanders),
                      [&](std::string_view beginning) { return busName.starts_with(beginning); });
 }
 
-}  // namespace desktop
+std::span<const Action> commonActions(Role role) {
+  switch (role) {
+    case Role::Jukebox:
+      return kJukebox;
+    case Role::DiscPlayer:
+      return kDiscPlayer;
+    case Role::ClassicMovies:
+    case Role::ModernMovies:
+      return kMovies;
+    case Role::Presentation:
+      return kPresentation;
+    case Role::PhotoLibrary:
+      return kPhotoLibrary;
+    case Role::ProfessionalPhotos:
+    case Role::None:
+      break;
+  }
+  return {};
+}
+
+bool hasOwnAction(const Program* program, tarnscript::Code word) {
+  return program != nullptr &&
+         std::ranges::find(program->actions, word, &Action::word) != program->actions.end();
+}
+
+std::vector<Action> actionsFor(Role role, const Program* program, tarnscript::Code word) {
+  const std::span<const Action> rows =
+      hasOwnAction(program, word) ? std::span<const Action>(program->actions) : commonActions(role);
+  std::vector<Action> found;
+  std::ranges::copy_if(rows, std::back_inserter(found),
+                       [&](const Action& action) { return action.word == word; });
+  return found;
+}
+
+}  // namespace linux::programs

@@ -6,7 +6,7 @@
 #include "platform/linux/sound/sound.h"
 #include "platform/scripting/additions_dictionary.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
 
@@ -37,7 +37,7 @@ class Additions final : public tarnscript::Application {
 };
 
 Value volumeSettings() {
-  const auto state = soundState();
+  const auto state = sound::soundState();
   require(state.has_value());
   return std::make_shared<const std::map<Code, Value>>(std::map<Code, Value>{
       {words::kOutputVolume, std::int64_t{state->volume}},
@@ -47,9 +47,9 @@ Value volumeSettings() {
 
 void setVolume(const std::map<Code, Value>& parameters) {
   const auto volume = parameters.find(words::kOutputVolume);
-  if (volume != parameters.end()) require(setOutputVolume(tarnscript::toInt32(volume->second)));
+  if (volume != parameters.end()) require(sound::setOutputVolume(tarnscript::toInt32(volume->second)));
   const auto muted = parameters.find(words::kOutputMuted);
-  if (muted != parameters.end()) require(setOutputMuted(tarnscript::toInt32(muted->second) != 0));
+  if (muted != parameters.end()) require(sound::setOutputMuted(tarnscript::toInt32(muted->second) != 0));
 }
 
 Value Additions::perform(const tarnscript::Event& event) {
@@ -66,4 +66,4 @@ tarnscript::Application& additions() {
   return instance;
 }
 
-}  // namespace desktop
+}  // namespace linux::roles

@@ -3,9 +3,9 @@
 
 #include "platform/tarnscript/tarnscript.h"
 
-namespace desktop {
+namespace linux::roles {
 
 /// "get volume settings" and "set volume" on the default sink. Borrowed; lives as long as the process.
 tarnscript::Application& additions();
 
-}  // namespace desktop
+}  // namespace linux::roles

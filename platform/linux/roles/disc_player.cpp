@@ -1,21 +1,26 @@
-// The disc player: discs with menus and chapters, and plain files as if they had some.
+#include "platform/linux/roles/disc_player.h"
 
 #include <algorithm>
 #include <cmath>
 #include <iterator>
 
-#include "platform/linux/windows/keystrokes.h"
 #include "platform/linux/players/playback.h"
-#include "platform/linux/roles/role_application.h"
 #include "platform/linux/players/scan.h"
-#include "platform/linux/players/vlc_channel.h"
+#include "platform/linux/programs/own_words.h"
+#include "platform/linux/roles/perform.h"
+#include "platform/linux/roles/playing.h"
+#include "platform/linux/roles/role_application.h"
 #include "platform/scripting/spindle_dictionary.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
 
 namespace words = scripting::spindle;
+using players::Place;
+using players::PlaybackStatus;
+using players::Player;
+using players::PlayerState;
 using tarnscript::Constant;
 using tarnscript::ObjectRef;
 using tarnscript::Refusal;
@@ -24,32 +29,33 @@ using tarnscript::Value;
 /// The volume in the words of scripts.
 constexpr double kFullVolume = 255;
 
-struct ScanRate {
-  words::Code code;
-  double rate;
-};
-
-constexpr ScanRate kScanRates[] = {
-    {words::kX1, 1}, {words::kX2, 2}, {words::kX4, 4}, {words::kX8, 8}, {words::kX16, 16}, {words::kX32, 32},
-};
+// TEMPORARY
+std::optional<double> rateOf(words::Code code) {
+  if (code == words::kX1) return 1;
+  if (code == words::kX2) return 2;
+  if (code == words::kX4) return 4;
+  if (code == words::kX8) return 8;
+  if (code == words::kX16) return 16;
+  if (code == words::kX32) return 32;
+  return std::nullopt;
+}
 
 /// How a chapter is gone to.
 enum class Way : std::uint8_t {
-  Channel,   ///< by its number, over VLC's channel
-  Keys,      ///< one on or back, by VLC's keys: it does not tell where it stands
+  Channel,   ///< by its number, over the program's channel
+  Actions,   ///< one on or back, as its row says: it does not tell where it stands
   PlayList,  ///< one on or back in the play list
   None,      ///< a menu has no chapters
 };
 
-/// A chapter, counted from 1, and how many there are.
+/// A chapter, and how another one is gone to.
 struct Chapter {
-  int number;
-  int count;
+  Place place;
   Way way;
 };
 
 /// Where a film was left for the menu.
-struct Place {
+struct FilmPlace {
   pid_t process = 0;
   int title = 1;
   std::int64_t seconds = 0;
@@ -63,47 +69,45 @@ bool isDisc(const PlayerState& state) {
                      [&](std::string_view scheme) { return state.url.starts_with(scheme); });
 }
 
-class DiscPlayer final : public RoleApplication {
- public:
-  DiscPlayer() : RoleApplication(Role::DiscPlayer) {}
+/// Nothing where the program has no channel that tells.
+std::optional<Place> titleOf(const Performer& performer) {
+  const players::ProgramChannel* const channel = performer.channel();
+  if (channel == nullptr || channel->title == nullptr) return std::nullopt;
+  return channel->title(performer.listener());
+}
 
-  const tarnscript::Dictionary& dictionary() const override { return words::dictionary(); }
-  Value get(const ObjectRef& object, tarnscript::Code property) override;
-  void set(const ObjectRef& object, tarnscript::Code property, const Value& value) override;
-  Value perform(const tarnscript::Event& event) override;
+std::optional<Place> chapterTold(const Performer& performer) {
+  const players::ProgramChannel* const channel = performer.channel();
+  if (channel == nullptr || channel->chapter == nullptr) return std::nullopt;
+  return channel->chapter(performer.listener());
+}
 
- private:
-  bool showsMenu(const PlayerState& state) const;
-  words::Code discState() const;
-  Chapter chapter(const PlayerState& state) const;
-  void goToChapter(int wanted) const;
-  void scanAt(double direction) const;
-  void goToMenu(const tarnscript::Event& event);
-  void returnToFilm() const;
-  void goToBeginning() const;
-  void stop() const;
+/// The channel that has just told something; throws tarnscript::Refusal when it has closed since.
+const players::ProgramChannel& requireChannel(const Performer& performer) {
+  const players::ProgramChannel* const channel = performer.channel();
+  if (channel == nullptr) throw Refusal{"its channel has closed"};
+  return *channel;
+}
 
-  words::Code scanRate_ = words::kX2;
-  Place left_;
-};
-
-/// Without its channel VLC does not tell.
-bool DiscPlayer::showsMenu(const PlayerState& state) const {
+/// False where the program does not tell.
+bool showsMenu(const Performer& performer, const PlayerState& state) {
   if (!isDisc(state) || state.status == PlaybackStatus::Stopped) return false;
-  const auto title = vlcTitle(instance().process);
+  const auto title = titleOf(performer);
   return title && title->number == 0 && title->count > 0;
 }
 
 bool hasMedia(Player& player, const PlayerState& state) {
-  return state.status != PlaybackStatus::Stopped || !state.url.empty() || !trackListOf(player).empty();
+  return state.status != PlaybackStatus::Stopped || !state.url.empty() ||
+         !players::trackListOf(player).empty();
 }
 
-words::Code DiscPlayer::discState() const {
-  const PlayerState state = stateOf(player());
-  if (scanRate(player())) return words::kPlaying;
-  if (!hasMedia(player(), state)) return words::kIdle;
+words::Code discState(const Performer& performer) {
+  Player& player = performer.player();
+  const PlayerState state = players::stateOf(player);
+  if (players::scanRate(player)) return words::kPlaying;
+  if (!hasMedia(player, state)) return words::kIdle;
   // Behind a menu the film stands still.
-  if (state.status == PlaybackStatus::Stopped || showsMenu(state)) return words::kStopped;
+  if (state.status == PlaybackStatus::Stopped || showsMenu(performer, state)) return words::kStopped;
   return state.status == PlaybackStatus::Playing ? words::kPlaying : words::kPaused;
 }
 
@@ -111,170 +115,194 @@ words::Code DiscPlayer::discState() const {
 Chapter placeInPlayList(Player& player, const PlayerState& state) {
   bool before = state.canGoPrevious;
   bool after = state.canGoNext;
-  // VLC says that it can always go on and back.
-  const auto tracks = trackListOf(player);
+  // Some players say that they can always go on and back.
+  const auto tracks = players::trackListOf(player);
   const auto current = std::find(tracks.begin(), tracks.end(), state.trackID);
   if (current != tracks.end()) {
     before = current != tracks.begin();
     after = std::next(current) != tracks.end();
   }
   const int number = before ? 2 : 1;
-  return {number, number + (after ? 1 : 0), Way::PlayList};
+  return {{number, number + (after ? 1 : 0)}, Way::PlayList};
 }
 
-Chapter DiscPlayer::chapter(const PlayerState& state) const {
-  if (showsMenu(state)) return {1, 1, Way::None};
-  const auto told = vlcChapter(instance().process);
-  if (told && told->count > 1) return {told->number + 1, told->count, Way::Channel};
-  if (isDisc(state) && instance().program != nullptr) return {2, 3, Way::Keys};
-  return placeInPlayList(player(), state);
-}
-
-void DiscPlayer::goToChapter(int wanted) const {
-  const PlayerState state = stateOf(player());
-  const Chapter now = chapter(state);
-  if (wanted < 1 || wanted > now.count || now.way == Way::None) throw Refusal{"there is no such chapter"};
-  endFastPlaying(player());
-  const bool onward = wanted > now.number;
-  if (wanted == now.number && (wanted == 1 || now.way != Way::Channel)) {
-    seekTo(player(), state, 0);
-  } else if (now.way == Way::PlayList) {
-    invoke(player(), onward ? "Next" : "Previous");
-  } else if (now.way == Way::Keys) {
-    type(instance(), onward ? "Shift+n" : "Shift+p");
-  } else if (state.status == PlaybackStatus::Playing) {
-    vlcCommand(instance().process, "chapter " + std::to_string(wanted - 1));
-  } else {
-    // A paused VLC takes no numbers.
-    vlcCommand(instance().process, onward ? "key key-chapter-next" : "key key-chapter-prev");
+Chapter chapterOf(const Performer& performer, const PlayerState& state) {
+  if (showsMenu(performer, state)) return {{1, 1}, Way::None};
+  const auto told = chapterTold(performer);
+  if (told && told->count > 1) return {*told, Way::Channel};
+  if (isDisc(state) && programs::hasOwnAction(performer.program(), programs::words::kNextChapter)) {
+    return {{2, 3}, Way::Actions};
   }
+  return placeInPlayList(performer.player(), state);
 }
 
-void DiscPlayer::scanAt(double direction) const {
-  if (showsMenu(stateOf(player()))) return;
-  const auto* const row = std::find_if(std::begin(kScanRates), std::end(kScanRates),
-                                       [&](const ScanRate& scan) { return scan.code == scanRate_; });
-  playAtRate(instance(), direction * row->rate);
-}
-
-void DiscPlayer::goToMenu(const tarnscript::Event& event) {
-  const PlayerState state = stateOf(player());
-  // A disc begins with its menu.
-  if (state.status == PlaybackStatus::Stopped) return startPlaying(instance());
-  if (!isDisc(state)) throw Refusal{"there is no menu"};
-  const auto title = vlcTitle(instance().process);
-  if (title && title->number > 0) left_ = {instance().process, title->number, secondsOf(state.position)};
-  endFastPlaying(player());
-  RoleApplication::perform(event);
-  // A paused VLC shows no buttons.
-  startPlaying(instance());
-}
-
-void DiscPlayer::returnToFilm() const {
-  const pid_t process = instance().process;
-  if (!showsMenu(stateOf(player()))) return;
-  const Place place = left_.process == process ? left_ : Place{};
-  vlcCommand(process, "title " + std::to_string(place.title));
-  vlcCommand(process, "seek " + std::to_string(place.seconds));
-  startPlaying(instance());
+void goToChapter(const Performer& performer, int wanted) {
+  Player& player = performer.player();
+  const PlayerState state = players::stateOf(player);
+  const auto [now, way] = chapterOf(performer, state);
+  if (wanted < 1 || wanted > now.count || way == Way::None) throw Refusal{"there is no such chapter"};
+  players::endFastPlaying(player);
+  const bool onward = wanted > now.number;
+  if (wanted == now.number && (wanted == 1 || way != Way::Channel)) {
+    players::seekTo(player, state, 0);
+  } else if (way == Way::PlayList) {
+    players::invoke(player, onward ? "Next" : "Previous");
+  } else if (way == Way::Actions) {
+    roles::perform(performer, onward ? programs::words::kNextChapter : programs::words::kPreviousChapter);
+  } else {
+    requireChannel(performer).goToChapter(performer.listener(), now.number, wanted,
+                                          state.status == PlaybackStatus::Playing);
+  }
 }
 
 /// A disc is put in anew, so to speak, and plays: what it shows first is for the disc to say.
-void DiscPlayer::goToBeginning() const {
-  const PlayerState state = stateOf(player());
-  if (!hasMedia(player(), state)) throw Refusal{"there is no disc"};
+void goToBeginning(const Performer& performer) {
+  Player& player = performer.player();
+  const PlayerState state = players::stateOf(player);
+  if (!hasMedia(player, state)) throw Refusal{"there is no disc"};
   // What is stopped begins there anyway.
   if (state.status == PlaybackStatus::Stopped) return;
-  endFastPlaying(player());
-  if (isDisc(state) && !state.trackID.empty()) return goToTrack(player(), state.trackID);
-  seekTo(player(), state, 0);
+  players::endFastPlaying(player);
+  if (isDisc(state) && !state.trackID.empty()) return players::goToTrack(player, state.trackID);
+  players::seekTo(player, state, 0);
 }
 
 /// A menu that was paused would show no buttons when one comes back to it.
-void DiscPlayer::stop() const {
-  if (showsMenu(stateOf(player()))) {
-    desktop::stop(player());
+void stop(const Performer& performer) {
+  if (showsMenu(performer, players::stateOf(performer.player()))) {
+    players::stop(performer.player());
   } else {
-    endPlaying(instance());
+    endPlaying(performer);
   }
 }
 
-Value DiscPlayer::get(const ObjectRef& object, tarnscript::Code property) {
+class DiscPlayer final : public RoleApplication {
+ public:
+  DiscPlayer() : RoleApplication(programs::Role::DiscPlayer) {}
+
+  const tarnscript::Dictionary& dictionary() const override { return words::dictionary(); }
+
+ protected:
+  Value getBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property) override;
+  void setBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property,
+             const Value& value) override;
+  Value performBy(const Performer& performer, const tarnscript::Event& event) override;
+
+ private:
+  void scanAt(const Performer& performer, double direction) const;
+  void goToMenu(const Performer& performer);
+  void returnToFilm(const Performer& performer) const;
+
+  words::Code scanRate_ = words::kX2;
+  FilmPlace left_;
+};
+
+void DiscPlayer::scanAt(const Performer& performer, double direction) const {
+  if (showsMenu(performer, players::stateOf(performer.player()))) return;
+  playAtRate(performer, direction * rateOf(scanRate_).value_or(1));
+}
+
+void DiscPlayer::goToMenu(const Performer& performer) {
+  Player& player = performer.player();
+  const PlayerState state = players::stateOf(player);
+  // A disc begins with its menu.
+  if (state.status == PlaybackStatus::Stopped) return startPlaying(performer);
+  if (!isDisc(state)) throw Refusal{"there is no menu"};
+  const auto title = titleOf(performer);
+  if (title && title->number > 0) {
+    left_ = {performer.instance().process, title->number, secondsOf(state.position)};
+  }
+  players::endFastPlaying(player);
+  roles::perform(performer, words::kGoToMainMenu);
+  // A paused player shows no buttons.
+  startPlaying(performer);
+}
+
+void DiscPlayer::returnToFilm(const Performer& performer) const {
+  if (!showsMenu(performer, players::stateOf(performer.player()))) return;
+  const FilmPlace place = left_.process == performer.instance().process ? left_ : FilmPlace{};
+  requireChannel(performer).goToTitle(performer.listener(), place.title, place.seconds);
+  startPlaying(performer);
+}
+
+Value DiscPlayer::getBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property) {
   if (property == words::kScanRate) return Constant{scanRate_};
-  if (property == words::kState) return Constant{discState()};
-  const PlayerState state = stateOf(player());
+  if (property == words::kState) return Constant{discState(performer)};
+  Player& player = performer.player();
+  const PlayerState state = players::stateOf(player);
   switch (property) {
     case words::kChapter:
-      return std::int64_t{chapter(state).number};
+      return std::int64_t{chapterOf(performer, state).place.number};
     case words::kAvailableChapters:
-      return std::int64_t{chapter(state).count};
+      return std::int64_t{chapterOf(performer, state).place.count};
     case words::kElapsedTime:
       return secondsOf(state.position);
     case words::kMenuActive:
-      return showsMenu(state);
+      return showsMenu(performer, state);
     case words::kActiveMenu:
-      return Constant{showsMenu(state) ? words::kMainMenu : words::kNoMenu};
+      return Constant{showsMenu(performer, state) ? words::kMainMenu : words::kNoMenu};
     case words::kHasMedia:
-      return hasMedia(player(), state);
+      return hasMedia(player, state);
     case words::kAudioVolume:
       return static_cast<std::int64_t>(std::lround(std::min(state.volume, 1.0) * kFullVolume));
     case words::kViewerFullScreen:
-      if (const auto fullscreen = fullscreenOf(player())) return *fullscreen;
+      if (const auto fullscreen = players::fullscreenOf(player)) return *fullscreen;
       break;
     default:
       break;
   }
-  return RoleApplication::get(object, property);
+  return RoleApplication::getBy(performer, object, property);
 }
 
-void DiscPlayer::set(const ObjectRef& object, tarnscript::Code property, const Value& value) {
+void DiscPlayer::setBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property,
+                       const Value& value) {
   switch (property) {
     case words::kScanRate: {
       const words::Code wanted = tarnscript::toTypeCode(value);
-      const bool known = std::any_of(std::begin(kScanRates), std::end(kScanRates),
-                                     [&](const ScanRate& scan) { return scan.code == wanted; });
-      if (known) scanRate_ = wanted;
+      if (rateOf(wanted)) scanRate_ = wanted;
       return;
     }
     case words::kChapter:
-      return goToChapter(tarnscript::toInt32(value));
-    case words::kAudioVolume:
-      return setVolume(player(), std::clamp(tarnscript::toInt32(value) / kFullVolume, 0.0, 1.0));
+      return goToChapter(performer, tarnscript::toInt32(value));
+    case words::kAudioVolume: {
+      const double volume = tarnscript::toInt32(value) / kFullVolume;
+      return players::setVolume(performer.player(), std::clamp(volume, 0.0, 1.0));
+    }
     case words::kViewerFullScreen:
-      return setFullscreen(player(), tarnscript::toInt32(value) != 0);
+      return players::setFullscreen(performer.player(), tarnscript::toInt32(value) != 0);
     default:
-      RoleApplication::set(object, property, value);
+      RoleApplication::setBy(performer, object, property, value);
   }
 }
 
-Value DiscPlayer::perform(const tarnscript::Event& event) {
+Value DiscPlayer::performBy(const Performer& performer, const tarnscript::Event& event) {
   switch (event.command) {
     case words::kPlayDVD:
-      startPlaying(instance());
+      startPlaying(performer);
       break;
     case words::kPauseDVD:
-      endPlaying(instance());
+      endPlaying(performer);
       break;
     case words::kStopDVD:
-      stop();
+      stop(performer);
       break;
     case words::kFastForwardDVD:
-      scanAt(1);
+      scanAt(performer, 1);
       break;
     case words::kRewindDVD:
-      scanAt(-1);
+      scanAt(performer, -1);
       break;
     case words::kGoToMainMenu:
-      goToMenu(event);
+      goToMenu(performer);
       break;
     case words::kGoReturn:
-      returnToFilm();
+      returnToFilm(performer);
       break;
     case words::kGoToBeginning:
-      goToBeginning();
+      goToBeginning(performer);
       break;
     default:
-      return RoleApplication::perform(event);
+      return RoleApplication::performBy(performer, event);
   }
   return {};
 }
@@ -286,4 +314,4 @@ tarnscript::Application& discPlayer() {
   return application;
 }
 
-}  // namespace desktop
+}  // namespace linux::roles

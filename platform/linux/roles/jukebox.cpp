@@ -1,18 +1,21 @@
-// The jukebox: the words of a music player.
+#include "platform/linux/roles/jukebox.h"
 
 #include <algorithm>
 #include <cmath>
 
 #include "platform/linux/players/playback.h"
-#include "platform/linux/roles/role_application.h"
 #include "platform/linux/players/scan.h"
+#include "platform/linux/roles/playing.h"
+#include "platform/linux/roles/role_application.h"
 #include "platform/scripting/lyrabox_dictionary.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
 
 namespace words = scripting::lyrabox;
+using players::PlaybackStatus;
+using players::PlayerState;
 using tarnscript::Constant;
 using tarnscript::ObjectRef;
 using tarnscript::Refusal;
@@ -24,30 +27,34 @@ constexpr double kScanRate = 8;
 constexpr std::int64_t kWellUnderWay = 3'000'000;
 /// The volume in the words of scripts.
 constexpr double kFullVolume = 100;
+/// Microseconds.
 constexpr double kSecond = 1e6;
+/// No position is that far from the beginning, in seconds.
+constexpr double kLongest = 1e9;
 
 /// The one track that a player tells of.
 constexpr std::uint64_t kCurrent = 1;
 
 class Jukebox final : public RoleApplication {
  public:
-  Jukebox() : RoleApplication(Role::Jukebox) {}
+  Jukebox() : RoleApplication(programs::Role::Jukebox) {}
 
   const tarnscript::Dictionary& dictionary() const override { return words::dictionary(); }
-  Value get(const ObjectRef& object, tarnscript::Code property) override;
-  void set(const ObjectRef& object, tarnscript::Code property, const Value& value) override;
-  std::vector<ObjectRef> elements(const ObjectRef& object, tarnscript::Code cls) override;
-  Value perform(const tarnscript::Event& event) override;
 
- private:
-  Value getOfTrack(tarnscript::Code property) const;
-  words::Code playerState() const;
-  void backTrack() const;
+ protected:
+  Value getBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property) override;
+  void setBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property,
+             const Value& value) override;
+  std::vector<ObjectRef> elementsBy(const Performer& performer, const ObjectRef& object,
+                                    tarnscript::Code cls) override;
+  Value performBy(const Performer& performer, const tarnscript::Event& event) override;
 };
 
-words::Code Jukebox::playerState() const {
-  if (const auto rate = scanRate(player())) return *rate > 0 ? words::kFastForwarding : words::kRewinding;
-  switch (statusOf(player())) {
+words::Code playerState(players::Player& player) {
+  if (const auto rate = players::scanRate(player)) {
+    return *rate > 0 ? words::kFastForwarding : words::kRewinding;
+  }
+  switch (players::statusOf(player)) {
     case PlaybackStatus::Playing:
       return words::kPlaying;
     case PlaybackStatus::Paused:
@@ -58,91 +65,96 @@ words::Code Jukebox::playerState() const {
   return words::kStopped;
 }
 
-Value Jukebox::getOfTrack(tarnscript::Code property) const {
-  const PlayerState state = stateOf(player());
+Value getOfTrack(players::Player& player, tarnscript::Code property) {
+  const PlayerState state = players::stateOf(player);
   if (property == words::kName) return state.title;
   if (property == words::kDuration && state.length) return static_cast<double>(*state.length) / kSecond;
   throw Refusal{"the player does not tell that"};
 }
 
-Value Jukebox::get(const ObjectRef& object, tarnscript::Code property) {
-  if (object.cls == words::kTrack) return getOfTrack(property);
+Value Jukebox::getBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property) {
+  players::Player& player = performer.player();
+  if (object.cls == words::kTrack) return getOfTrack(player, property);
   switch (property) {
     case words::kPlayerState:
-      return Constant{playerState()};
+      return Constant{playerState(player)};
     case words::kPlayerPosition:
-      return static_cast<double>(stateOf(player()).position) / kSecond;
+      return static_cast<double>(players::stateOf(player).position) / kSecond;
     case words::kSoundVolume:
-      return static_cast<std::int64_t>(std::lround(std::min(stateOf(player()).volume, 1.0) * kFullVolume));
+      return static_cast<std::int64_t>(
+          std::lround(std::min(players::stateOf(player).volume, 1.0) * kFullVolume));
     case words::kCurrentTrack:
       return ObjectRef{this, words::kTrack, kCurrent};
     default:
-      return RoleApplication::get(object, property);
+      return RoleApplication::getBy(performer, object, property);
   }
 }
 
-void Jukebox::set(const ObjectRef& object, tarnscript::Code property, const Value& value) {
+void Jukebox::setBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property,
+                    const Value& value) {
   if (object.cls == words::kTrack) throw Refusal{"tracks cannot be changed"};
   if (property == words::kSoundVolume) {
-    return setVolume(player(), std::clamp(tarnscript::toInt32(value) / kFullVolume, 0.0, 1.0));
+    const double volume = tarnscript::toInt32(value) / kFullVolume;
+    return players::setVolume(performer.player(), std::clamp(volume, 0.0, 1.0));
   }
   const auto* const seconds = std::get_if<double>(&value);
-  if (property == words::kPlayerPosition && seconds != nullptr && std::abs(*seconds) < 1e9) {
-    return seekTo(player(), static_cast<std::int64_t>(*seconds * kSecond));
+  if (property == words::kPlayerPosition && seconds != nullptr && std::abs(*seconds) < kLongest) {
+    return players::seekTo(performer.player(), static_cast<std::int64_t>(*seconds * kSecond));
   }
-  RoleApplication::set(object, property, value);
+  RoleApplication::setBy(performer, object, property, value);
 }
 
-std::vector<ObjectRef> Jukebox::elements(const ObjectRef& object, tarnscript::Code cls) {
+std::vector<ObjectRef> Jukebox::elementsBy(const Performer& performer, const ObjectRef& object,
+                                           tarnscript::Code cls) {
   if (object.cls != tarnscript::kApplicationClass || cls != words::kTrack) {
-    return RoleApplication::elements(object, cls);
+    return RoleApplication::elementsBy(performer, object, cls);
   }
   return {{this, words::kTrack, kCurrent}};
 }
 
-void Jukebox::backTrack() const {
-  const PlayerState state = stateOf(player());
+void goBack(players::Player& player) {
+  const PlayerState state = players::stateOf(player);
   if (state.canSeek && state.position > kWellUnderWay) {
-    seekTo(player(), state, 0);
+    players::seekTo(player, state, 0);
   } else {
-    invoke(player(), "Previous");
+    players::invoke(player, "Previous");
   }
 }
 
-Value Jukebox::perform(const tarnscript::Event& event) {
+Value Jukebox::performBy(const Performer& performer, const tarnscript::Event& event) {
   switch (event.command) {
     case words::kPlay:
-      startPlaying(instance());
+      startPlaying(performer);
       break;
     case words::kPause:
     case words::kStop:
-      endPlaying(instance());
+      endPlaying(performer);
       break;
     case words::kPlayPause:
-      if (isPlaying(player())) {
-        endPlaying(instance());
+      if (players::isPlaying(performer.player())) {
+        endPlaying(performer);
       } else {
-        startPlaying(instance());
+        startPlaying(performer);
       }
       break;
     case words::kResume:
-      endFastPlaying(player());
+      players::endFastPlaying(performer.player());
       break;
     case words::kFastForward:
-      scan(player(), kScanRate);
+      players::scan(performer.player(), kScanRate);
       break;
     case words::kRewind:
-      scan(player(), -kScanRate);
+      players::scan(performer.player(), -kScanRate);
       break;
     case words::kBackTrack:
-      endFastPlaying(player());
-      backTrack();
+      players::endFastPlaying(performer.player());
+      goBack(performer.player());
       break;
     case words::kNextTrack:
-      endFastPlaying(player());
-      return RoleApplication::perform(event);
+      players::endFastPlaying(performer.player());
+      return RoleApplication::performBy(performer, event);
     default:
-      return RoleApplication::perform(event);
+      return RoleApplication::performBy(performer, event);
   }
   return {};
 }
@@ -154,4 +166,4 @@ tarnscript::Application& jukebox() {
   return application;
 }
 
-}  // namespace desktop
+}  // namespace linux::roles

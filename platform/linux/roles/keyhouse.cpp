@@ -1,20 +1,19 @@
-// The keystroke helper: keys for one running program, or for the one in front.
-
-#include "platform/scripting/keyhouse_dictionary.h"
+#include "platform/linux/roles/keyhouse.h"
 
 #include <string>
 #include <utility>
 
-#include "platform/linux/roles/deeds.h"
-#include "platform/linux/roles/own_words.h"
+#include "platform/linux/programs/own_words.h"
+#include "platform/linux/roles/perform.h"
 #include "platform/linux/roles/posted_keys.h"
-#include "platform/linux/roles/role_application.h"
+#include "platform/scripting/keyhouse_dictionary.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
 
 namespace keyhouse = scripting::keyhouse;
+using programs::Instance;
 using tarnscript::Event;
 using tarnscript::ObjectRef;
 using tarnscript::Refusal;
@@ -22,10 +21,10 @@ using tarnscript::Value;
 
 constexpr std::uint16_t kVirtualEscape = 53;
 
-constexpr std::pair<tarnscript::Code, std::uint16_t> kModifiers[] = {
-    {keyhouse::kShiftDown, kShift},
-    {keyhouse::kOptionDown, kAlt},
-    {keyhouse::kControlDown, kControl},
+constexpr std::pair<tarnscript::Code, windows::Modifier> kModifiers[] = {
+    {keyhouse::kShiftDown, windows::kShift},
+    {keyhouse::kOptionDown, windows::kAlt},
+    {keyhouse::kControlDown, windows::kControl},
 };
 
 std::uint64_t idOf(const HostProcessSerialNumber& process) {
@@ -53,31 +52,32 @@ class Keyhouse final : public tarnscript::Application {
 
   ObjectRef elementWithID(const ObjectRef&, tarnscript::Code, const Value& id) override {
     const auto* const identifier = std::get_if<std::string>(&id);
-    const Role role = identifier != nullptr ? roleOf(*identifier) : Role::None;
-    const Instance* const first = role != Role::None ? firstInstance(role) : nullptr;
+    const programs::Role role = identifier != nullptr ? programs::roleOf(*identifier) : programs::Role::None;
+    const Instance* const first = programs::firstInstance(role);
     if (first == nullptr) throw Refusal{"there is no such process"};
     return {this, keyhouse::kProcess, idOf(first->serialNumber)};
   }
 
   Value perform(const Event& event) override {
     if (!event.direct) throw Refusal{"there is no key"};
-    const Instance* const receiver =
-        event.target.cls == keyhouse::kProcess ? findInstance(processOf(event.target.id)) : frontInstance();
+    const Instance* const receiver = event.target.cls == keyhouse::kProcess
+                                         ? programs::findInstance(processOf(event.target.id))
+                                         : programs::frontInstance();
     if (receiver == nullptr) throw Refusal{"nobody takes the key"};
     const auto used = event.parameters.find(keyhouse::kUsing);
-    press(*receiver, static_cast<std::uint16_t>(tarnscript::toInt32(*event.direct)),
+    press(Performer(*receiver), static_cast<std::uint16_t>(tarnscript::toInt32(*event.direct)),
           used != event.parameters.end() ? tarnscript::toTypeCode(used->second) : 0);
     return {};
   }
 
  private:
-  static void press(const Instance& receiver, std::uint16_t virtualKey, tarnscript::Code modifier) {
+  static void press(const Performer& receiver, std::uint16_t virtualKey, tarnscript::Code modifier) {
     if (modifier == keyhouse::kCommandDown) {
       // No keyboard here has that key: the one shortcut in use has rows of its own.
       if (virtualKey != kVirtualEscape) throw Refusal{"there is no such key"};
-      return desktop::perform(receiver, words::kCommandEscape);
+      return roles::perform(receiver, programs::words::kCommandEscape);
     }
-    std::uint16_t modifiers = kNoModifier;
+    windows::Modifiers modifiers = windows::kNoModifier;
     for (const auto& [code, held] : kModifiers) {
       if (code == modifier) modifiers = held;
     }
@@ -92,4 +92,4 @@ tarnscript::Application& keyhouse() {
   return theKeyhouse;
 }
 
-}  // namespace desktop
+}  // namespace linux::roles

@@ -1,42 +1,50 @@
-// The two movie players. They differ in their words and in the scale of their volume.
+#include "platform/linux/roles/movies.h"
 
 #include <algorithm>
 #include <cmath>
 
 #include "platform/linux/players/playback.h"
+#include "platform/linux/roles/playing.h"
 #include "platform/linux/roles/remote_hud.h"
 #include "platform/linux/roles/role_application.h"
 #include "platform/scripting/movie_dictionaries.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
 
 namespace words = scripting::movies;
+using players::Player;
 using tarnscript::ObjectRef;
 using tarnscript::Refusal;
 using tarnscript::Value;
 
 /// A step of players that have none of their own, in microseconds.
 constexpr std::int64_t kStep = 10'000'000;
+/// Microseconds.
 constexpr double kSecond = 1e6;
+/// No position is that far from the beginning, in seconds.
+constexpr double kLongest = 1e9;
 
 class MoviePlayer final : public RoleApplication {
  public:
   /// The volume runs from 0 to `loudest`.
-  MoviePlayer(Role role, const tarnscript::Dictionary& dictionary, double loudest)
+  MoviePlayer(programs::Role role, const tarnscript::Dictionary& dictionary, double loudest)
       : RoleApplication(role), dictionary_(dictionary), loudest_(loudest) {}
 
   const tarnscript::Dictionary& dictionary() const override { return dictionary_; }
-  Value get(const ObjectRef& object, tarnscript::Code property) override;
-  void set(const ObjectRef& object, tarnscript::Code property, const Value& value) override;
-  /// The film of the first instance, where it has one.
-  std::vector<ObjectRef> elements(const ObjectRef& object, tarnscript::Code cls) override;
-  Value perform(const tarnscript::Event& event) override;
+
+ protected:
+  Value getBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property) override;
+  void setBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property,
+             const Value& value) override;
+  /// The film of the performer, where it has one.
+  std::vector<ObjectRef> elementsBy(const Performer& performer, const ObjectRef& object,
+                                    tarnscript::Code cls) override;
+  Value performBy(const Performer& performer, const tarnscript::Event& event) override;
 
  private:
-  Player& playerOfFilm(const ObjectRef& film) const;
-  void step(const tarnscript::Event& event, std::int64_t offset);
+  void step(const Performer& performer, const tarnscript::Event& event, std::int64_t offset);
 
   const tarnscript::Dictionary& dictionary_;
   const double loudest_;
@@ -48,103 +56,106 @@ double numberIn(const Value& value) {
 }
 
 bool hasFilm(Player& player) {
-  if (statusOf(player) != PlaybackStatus::Stopped) return true;
-  const PlayerState state = stateOf(player);
+  if (players::statusOf(player) != players::PlaybackStatus::Stopped) return true;
+  const players::PlayerState state = players::stateOf(player);
   return !state.url.empty() || !state.title.empty();
 }
 
-/// A film is known by the process that shows it.
-Player& MoviePlayer::playerOfFilm(const ObjectRef& film) const {
-  const Instance& shown = instance();
-  if (film.cls != words::kDocument || film.id != shown.serialNumber.low)
+/// A film is known by the process that shows it. Throws Refusal when that is no longer the performer.
+Player& playerOfFilm(const Performer& performer, const ObjectRef& film) {
+  if (film.cls != words::kDocument || film.id != performer.instance().serialNumber.low) {
     throw Refusal{"there is no such film"};
-  return requirePlayer(shown);
-}
-
-std::vector<ObjectRef> MoviePlayer::elements(const ObjectRef& object, tarnscript::Code cls) {
-  if (object.cls != tarnscript::kApplicationClass || cls != words::kDocument) {
-    return RoleApplication::elements(object, cls);
   }
-  if (!hasFilm(player())) return {};
-  return {{this, words::kDocument, instance().serialNumber.low}};
+  return performer.player();
 }
 
-Value MoviePlayer::get(const ObjectRef& object, tarnscript::Code property) {
+std::vector<ObjectRef> MoviePlayer::elementsBy(const Performer& performer, const ObjectRef& object,
+                                               tarnscript::Code cls) {
+  if (object.cls != tarnscript::kApplicationClass || cls != words::kDocument) {
+    return RoleApplication::elementsBy(performer, object, cls);
+  }
+  if (!hasFilm(performer.player())) return {};
+  return {{this, words::kDocument, performer.instance().serialNumber.low}};
+}
+
+Value MoviePlayer::getBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property) {
   if (property == words::kViewerFullScreen) {
-    if (const auto fullscreen = fullscreenOf(player())) return *fullscreen;
+    if (const auto fullscreen = players::fullscreenOf(performer.player())) return *fullscreen;
     throw Refusal{"the player does not tell that"};
   }
-  Player& player = playerOfFilm(object);
+  Player& player = playerOfFilm(performer, object);
   switch (property) {
     case words::kPlaying:
-      return isPlaying(player);
+      return players::isPlaying(player);
     case words::kRate:
-      return rateOf(player);
+      return players::rateOf(player);
     case words::kName:
-      return stateOf(player).title;
+      return players::stateOf(player).title;
     case words::kVolume: {
-      const double volume = std::min(stateOf(player).volume, 1.0) * loudest_;
+      const double volume = std::min(players::stateOf(player).volume, 1.0) * loudest_;
       if (loudest_ == 1) return volume;
       return static_cast<std::int64_t>(std::lround(volume));
     }
     case words::kCurrentTime:
-      return static_cast<double>(stateOf(player).position) / kSecond;
+      return static_cast<double>(players::stateOf(player).position) / kSecond;
     case words::kDuration:
-      if (const auto length = stateOf(player).length) return static_cast<double>(*length) / kSecond;
+      if (const auto length = players::stateOf(player).length) return static_cast<double>(*length) / kSecond;
       break;
     default:
       break;
   }
-  return RoleApplication::get(object, property);
+  return RoleApplication::getBy(performer, object, property);
 }
 
-void MoviePlayer::set(const ObjectRef& object, tarnscript::Code property, const Value& value) {
-  if (property == words::kViewerFullScreen) return setFullscreen(player(), tarnscript::toInt32(value) != 0);
-  Player& player = playerOfFilm(object);
+void MoviePlayer::setBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property,
+                        const Value& value) {
+  if (property == words::kViewerFullScreen) {
+    return players::setFullscreen(performer.player(), tarnscript::toInt32(value) != 0);
+  }
+  Player& player = playerOfFilm(performer, object);
   const double number = numberIn(value);
-  if (property == words::kRate) return playAtRate(instance(), number);
+  if (property == words::kRate) return playAtRate(performer, number);
   if (property == words::kVolume && !std::isnan(number)) {
-    return setVolume(player, std::clamp(number / loudest_, 0.0, 1.0));
+    return players::setVolume(player, std::clamp(number / loudest_, 0.0, 1.0));
   }
-  if (property == words::kCurrentTime && std::abs(number) < 1e9) {
-    return seekTo(player, static_cast<std::int64_t>(number * kSecond));
+  if (property == words::kCurrentTime && std::abs(number) < kLongest) {
+    return players::seekTo(player, static_cast<std::int64_t>(number * kSecond));
   }
-  RoleApplication::set(object, property, value);
+  RoleApplication::setBy(performer, object, property, value);
 }
 
-/// By mpv's own step of one frame, which leaves the film standing; elsewhere by a stretch.
-void MoviePlayer::step(const tarnscript::Event& event, std::int64_t offset) {
-  endFastPlaying(player());
-  const Program* const program = instance().program;
-  if (program != nullptr && std::string_view(program->entry) == "mpv") {
-    RoleApplication::perform(event);
+/// By the program's own step of one frame, which leaves the film standing; elsewhere by a stretch.
+void MoviePlayer::step(const Performer& performer, const tarnscript::Event& event, std::int64_t offset) {
+  players::endFastPlaying(performer.player());
+  if (programs::hasOwnAction(performer.program(), event.command)) {
+    RoleApplication::performBy(performer, event);
   } else {
-    seekBy(player(), offset);
+    players::seekBy(performer.player(), offset);
   }
 }
 
-Value MoviePlayer::perform(const tarnscript::Event& event) {
+Value MoviePlayer::performBy(const Performer& performer, const tarnscript::Event& event) {
   const auto* const direct = event.direct ? std::get_if<ObjectRef>(&*event.direct) : nullptr;
-  playerOfFilm(direct != nullptr ? *direct : event.target);
+  playerOfFilm(performer, direct != nullptr ? *direct : event.target);
   switch (event.command) {
     case words::kPlay:
-      startPlaying(instance());
+      startPlaying(performer);
       break;
     case words::kPause:
     case words::kStop:
-      endPlaying(instance());
+      endPlaying(performer);
       break;
     case words::kStepForward:
-      step(event, kStep);
+      step(performer, event, kStep);
       break;
     case words::kStepBackward:
-      step(event, -kStep);
+      step(performer, event, -kStep);
       break;
     case words::kShowRemoteHUD:
-      showRemoteHUD(instance());
+      showRemoteHUD(performer);
       break;
     default:
-      return RoleApplication::perform(event);
+      return RoleApplication::performBy(performer, event);
   }
   return {};
 }
@@ -152,13 +163,13 @@ Value MoviePlayer::perform(const tarnscript::Event& event) {
 }  // namespace
 
 tarnscript::Application& classicMovies() {
-  static MoviePlayer application(Role::ClassicMovies, words::classicDictionary(), 256);
+  static MoviePlayer application(programs::Role::ClassicMovies, words::classicDictionary(), 256);
   return application;
 }
 
 tarnscript::Application& modernMovies() {
-  static MoviePlayer application(Role::ModernMovies, words::modernDictionary(), 1);
+  static MoviePlayer application(programs::Role::ModernMovies, words::modernDictionary(), 1);
   return application;
 }
 
-}  // namespace desktop
+}  // namespace linux::roles

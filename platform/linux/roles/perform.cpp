@@ -1,66 +1,68 @@
-#include "platform/linux/roles/deeds.h"
-#include "platform/linux/players/gtk_actions.h"
-#include "platform/linux/windows/keystrokes.h"
-#include "platform/linux/players/mpv_channel.h"
-#include "platform/linux/players/vlc_channel.h"
+#include "platform/linux/roles/perform.h"
 
-namespace desktop {
+#include <algorithm>
+#include <array>
+#include <sstream>
+#include <string>
+
+#include "platform/linux/players/gtk_actions.h"
+#include "platform/linux/players/mpris.h"
+#include "platform/linux/windows/keystrokes.h"
+
+namespace linux::roles {
 
 namespace {
 
-bool isFor(const Deed& deed, const Instance& instance) {
-  if (deed.program == nullptr) return true;
-  return instance.program != nullptr && std::string_view(deed.program) == instance.program->entry;
-}
+using programs::Means;
 
-/// Whether some row is written for this very program; then those for any other do not count.
-bool hasRowsOfItsOwn(const Instance& instance, tarnscript::Code word) {
-  for (const Deed& deed : deeds()) {
-    if (deed.role == instance.role && deed.word == word && deed.program != nullptr && isFor(deed, instance)) {
-      return true;
-    }
+/// Calls "NAME PATH INTERFACE MEMBER", where '%' in the name stands for the process. False when nobody has
+/// that name.
+bool callMethod(pid_t process, const std::string& how) {
+  std::istringstream words(how);
+  std::string name, path, interface, member;
+  words >> name >> path >> interface >> member;
+  if (const std::size_t at = name.find('%'); at != std::string::npos) {
+    name.replace(at, 1, std::to_string(process));
   }
-  return false;
+  return system::nameHasOwner(name.c_str()) &&
+         system::send({name, process}, {path.c_str(), interface.c_str(), member.c_str()}, "");
 }
 
-/// False when the row's way is not open on this program.
-bool carryOut(const Deed& deed, const Instance& instance) {
-  switch (deed.means) {
-    case Means::Mpris: {
-      Player* const player = playerOf(instance);
-      if (player == nullptr) return false;
-      invoke(*player, deed.how);
+/// False when the action's way is not open on this program.
+bool carryOut(const programs::Action& action, const Performer& performer) {
+  const windows::Window* window = nullptr;
+  switch (action.means) {
+    case Means::Mpris:
+      if (performer.playerIfAny() == nullptr) return false;
+      players::invoke(performer.player(), action.how);
+      return true;
+    case Means::Channel: {
+      const players::ProgramChannel* const channel = performer.channel();
+      if (channel == nullptr) return false;
+      channel->command(performer.listener(), action.how);
       return true;
     }
-    case Means::Mpv:
-      if (!hasMpvChannel(instance.process)) return false;
-      mpvCommand(instance.process, deed.how);
-      return true;
-    case Means::Rc:
-      if (!hasVlcChannel(instance.process)) return false;
-      vlcCommand(instance.process, deed.how);
-      return true;
     case Means::Action:
-      return activateAction(instance, deed.how);
+      window = performer.keyboardWindow();
+      return window != nullptr && players::activateAction(*window, action.how);
+    case Means::Method:
+      return callMethod(performer.instance().process, action.how);
     case Means::Key:
-      return type(instance, deed.how);
+      window = performer.keyboardWindow();
+      return window != nullptr && windows::type(window->id, action.how);
     case Means::Nothing:
       return true;
-    case Means::Code:
-      return false;
   }
   return false;
 }
 
 }  // namespace
 
-void perform(const Instance& instance, tarnscript::Code word) {
-  const bool own = hasRowsOfItsOwn(instance, word);
-  for (const Deed& deed : deeds()) {
-    if (deed.role != instance.role || deed.word != word || own != (deed.program != nullptr)) continue;
-    if (isFor(deed, instance) && carryOut(deed, instance)) return;
-  }
-  throw tarnscript::Refusal{"the program has no way to do that"};
+void perform(const Performer& performer, tarnscript::Code word) {
+  const auto actions = programs::actionsFor(performer.instance().role, performer.program(), word);
+  const bool done =
+      std::ranges::any_of(actions, [&](const auto& action) { return carryOut(action, performer); });
+  if (!done) throw tarnscript::Refusal{"the program has no way to do that"};
 }
 
-}  // namespace desktop
+}  // namespace linux::roles

@@ -1,20 +1,20 @@
 #include "platform/linux/roles/posted_keys.h"
 
-#include "platform/linux/roles/deeds.h"
-#include "platform/linux/windows/keystrokes.h"
+#include "platform/linux/programs/own_words.h"
+#include "platform/linux/roles/perform.h"
 #include "platform/linux/windows/keysyms.h"
-#include "platform/linux/roles/own_words.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
 
-/// Does what the program's row for the key says. False when it has none, or one whose way is not open.
-bool doneOtherwise(const Instance& instance, std::uint16_t virtualKey, std::uint16_t modifiers) {
-  const tarnscript::Code word = wordForKey(virtualKey, (modifiers & kShift) != 0);
+/// Does what the program's action for the key says. False when it has none, or one whose way is not open.
+bool doneOtherwise(const Performer& performer, std::uint16_t virtualKey, windows::Modifiers modifiers) {
+  const bool withShift = (modifiers & windows::kShift) != 0;
+  const tarnscript::Code word = programs::words::wordForKey(virtualKey, withShift);
   if (word == 0) return false;
   try {
-    perform(instance, word);
+    perform(performer, word);
     return true;
   } catch (const tarnscript::Refusal&) {
     return false;
@@ -23,15 +23,16 @@ bool doneOtherwise(const Instance& instance, std::uint16_t virtualKey, std::uint
 
 }  // namespace
 
-Window pressKey(const Instance& instance, std::uint16_t virtualKey, std::uint16_t modifiers) {
-  if (doneOtherwise(instance, virtualKey, modifiers)) return 0;
-  const std::uint32_t keysym = keysymOf(virtualKey);
-  const Window window = keyboardWindow(instance);
-  return keysym != 0 && sendKey(window, keysym, true, modifiers) ? window : 0;
+windows::ID pressKey(const Performer& performer, std::uint16_t virtualKey, windows::Modifiers modifiers) {
+  if (doneOtherwise(performer, virtualKey, modifiers)) return {};
+  const std::uint32_t keysym = windows::keysymOf(virtualKey);
+  const windows::Window* const window = performer.keyboardWindow();
+  if (keysym == 0 || window == nullptr || !windows::sendKey(window->id, keysym, true, modifiers)) return {};
+  return window->id;
 }
 
-void releaseKey(Window window, std::uint16_t virtualKey, std::uint16_t modifiers) {
-  if (window != 0) sendKey(window, keysymOf(virtualKey), false, modifiers);
+void releaseKey(windows::ID window, std::uint16_t virtualKey, windows::Modifiers modifiers) {
+  windows::sendKey(window, windows::keysymOf(virtualKey), false, modifiers);
 }
 
-}  // namespace desktop
+}  // namespace linux::roles

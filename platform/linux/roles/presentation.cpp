@@ -1,155 +1,156 @@
-// The presentation program: a document is open, and its show plays in a full-screen window.
+#include "platform/linux/roles/presentation.h"
 
 #include <algorithm>
 #include <string>
-#include <string_view>
 
-#include "platform/linux/system/bus.h"
-#include "platform/linux/roles/deeds.h"
-#include "platform/linux/players/gtk_actions.h"
-#include "platform/linux/windows/keystrokes.h"
+#include "platform/linux/programs/own_words.h"
+#include "platform/linux/roles/perform.h"
 #include "platform/linux/roles/role_application.h"
 #include "platform/linux/roles/show_window.h"
 #include "platform/scripting/slidewell_dictionary.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
 
 namespace slidewell = scripting::slidewell;
+namespace words = programs::words;
 using tarnscript::Event;
 using tarnscript::ObjectRef;
 using tarnscript::Refusal;
 using tarnscript::Value;
+using windows::Window;
 
 /// The slides that can be asked for; how many lie between them, nobody tells.
 enum Slide : std::uint64_t { kFirstSlide = 1, kLastSlide = 2 };
 
-/// As okular names itself on the bus; its keys for this work only while its window is in front.
-bool startInOkular(const Instance& instance) {
-  const std::string name = "org.kde.okular-" + std::to_string(instance.process);
-  return nameHasOwner(name.c_str()) &&
-         send({name, instance.process}, {"/okular", "org.kde.okular", "slotTogglePresentation"}, "");
+/// The program as if the show's window were its only one. Throws Refusal when no show plays.
+Performer shown(const Performer& performer) {
+  const Window* const show = showWindow(performer);
+  if (show == nullptr) throw Refusal{"no show plays"};
+  return performer.in(*show);
 }
 
 class Presentation final : public RoleApplication {
  public:
-  Presentation() : RoleApplication(Role::Presentation) {}
+  Presentation() : RoleApplication(programs::Role::Presentation) {}
 
   const tarnscript::Dictionary& dictionary() const override { return slidewell::dictionary(); }
 
-  Value get(const ObjectRef& object, tarnscript::Code property) override {
-    switch (property) {
-      case slidewell::kPlaying:
-        return show() != 0;
-      case slidewell::kFrozen:
-        return isFrozen(show());
-      case slidewell::kSwitcherVisible:
-        return false;
-      case slidewell::kName:
-        return textProperty(keyboardWindow(instance()), "_NET_WM_NAME");
-      default:
-        return RoleApplication::get(object, property);
-    }
-  }
-
-  void set(const ObjectRef& object, tarnscript::Code property, const Value& value) override {
-    if (property != slidewell::kFrozen) return RoleApplication::set(object, property, value);
-    const bool freeze = tarnscript::toInt32(value) != 0;
-    const Instance shown = shownInstance();
-    if (freeze == isFrozen(shown.windows.front())) return;
-    type(shown, "b");
-    frozenIn_ = freeze ? shown.windows.front() : 0;
-  }
-
-  std::vector<ObjectRef> elements(const ObjectRef& object, tarnscript::Code cls) override {
-    if (object.cls == tarnscript::kApplicationClass && cls == slidewell::kSlideshow) {
-      return {{this, slidewell::kSlideshow, 1}};
-    }
-    if (object.cls == slidewell::kSlideshow && cls == slidewell::kSlide) {
-      return {{this, slidewell::kSlide, kFirstSlide}, {this, slidewell::kSlide, kLastSlide}};
-    }
-    return RoleApplication::elements(object, cls);
-  }
-
-  Value perform(const Event& event) override {
-    switch (event.command) {
-      case slidewell::kStart:
-        start();
-        return {};
-      case slidewell::kStop:
-        stop();
-        return {};
-      case slidewell::kShow:
-        jump(event);
-        return {};
-      case slidewell::kShowNext:
-      case slidewell::kShowPrevious:
-        desktop::perform(shownInstance(), event.command);
-        // A step brings the picture back.
-        frozenIn_ = 0;
-        return {};
-      default:
-        return RoleApplication::perform(event);
-    }
-  }
+ protected:
+  Value getBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property) override;
+  void setBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property,
+             const Value& value) override;
+  std::vector<ObjectRef> elementsBy(const Performer& performer, const ObjectRef& object,
+                                    tarnscript::Code cls) override;
+  Value performBy(const Performer& performer, const Event& event) override;
 
  private:
-  /// The window in which the show plays; 0 when none does.
-  Window show() const { return showWindow(instance()); }
-
-  bool isFrozen(Window show) const { return show != 0 && show == frozenIn_; }
-
-  /// The program as if the show's window were its only one, so that keys go there.
-  Instance shownInstance() const {
-    const Window window = show();
-    if (window == 0) throw Refusal{"no show plays"};
-    Instance shown = instance();
-    shown.windows = {window};
-    return shown;
-  }
-
-  void start() {
-    Instance open = instance();
-    if (showWindow(open) != 0) return;
-    open.windows = documentWindows(open);
-    if (open.windows.empty()) throw Refusal{"no document is open"};
-    frozenIn_ = 0;
-    const bool isOkular =
-        open.program != nullptr && open.program->entry == std::string_view("org.kde.okular");
-    if (!isOkular || !startInOkular(open)) desktop::perform(open, slidewell::kStart);
-  }
-
-  /// Also said to a program that shows nothing: that must not disturb whoever works on slides.
-  void stop() {
-    const Window window = show();
-    if (window == 0) return;
-    const Instance shown = shownInstance();
-    // Where the picture is taken away, the first key only brings it back.
-    if (isFrozen(window)) type(shown, "Escape");
-    frozenIn_ = 0;
-    desktop::perform(shown, slidewell::kStop);
-  }
-
-  void jump(const Event& event) {
-    const auto* const slide = event.direct ? std::get_if<ObjectRef>(&*event.direct) : nullptr;
-    if (slide == nullptr || slide->application != this || slide->cls != slidewell::kSlide) {
-      throw Refusal{"only slides can be shown"};
-    }
-    type(shownInstance(), slide->id == kFirstSlide ? "Home" : "End");
-    frozenIn_ = 0;
-  }
+  bool isFrozen(const Window* show) const { return show != nullptr && show->id == frozenIn_; }
+  void start(const Performer& performer);
+  void stop(const Performer& performer);
+  void jump(const Performer& performer, const Event& event);
 
   /// The show whose picture was taken away with the key for it. Programs do not tell, so it is remembered;
   /// the next show has another window or begins unfrozen.
-  Window frozenIn_ = 0;
+  windows::ID frozenIn_;
 };
+
+Value Presentation::getBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property) {
+  switch (property) {
+    case slidewell::kPlaying:
+      return showWindow(performer) != nullptr;
+    case slidewell::kFrozen:
+      return isFrozen(showWindow(performer));
+    case slidewell::kSwitcherVisible:
+      return false;
+    case slidewell::kName: {
+      const Window* const window = performer.keyboardWindow();
+      return window != nullptr ? window->title : std::string();
+    }
+    default:
+      return RoleApplication::getBy(performer, object, property);
+  }
+}
+
+void Presentation::setBy(const Performer& performer, const ObjectRef& object, tarnscript::Code property,
+                         const Value& value) {
+  if (property != slidewell::kFrozen) return RoleApplication::setBy(performer, object, property, value);
+  const bool freeze = tarnscript::toInt32(value) != 0;
+  const Performer show = shown(performer);
+  const Window& window = show.windows().front();
+  if (freeze == isFrozen(&window)) return;
+  roles::perform(show, words::kFreeze);
+  frozenIn_ = freeze ? window.id : windows::ID();
+}
+
+std::vector<ObjectRef> Presentation::elementsBy(const Performer& performer, const ObjectRef& object,
+                                                tarnscript::Code cls) {
+  if (object.cls == tarnscript::kApplicationClass && cls == slidewell::kSlideshow) {
+    return {{this, slidewell::kSlideshow, 1}};
+  }
+  if (object.cls == slidewell::kSlideshow && cls == slidewell::kSlide) {
+    return {{this, slidewell::kSlide, kFirstSlide}, {this, slidewell::kSlide, kLastSlide}};
+  }
+  return RoleApplication::elementsBy(performer, object, cls);
+}
+
+Value Presentation::performBy(const Performer& performer, const Event& event) {
+  switch (event.command) {
+    case slidewell::kStart:
+      start(performer);
+      return {};
+    case slidewell::kStop:
+      stop(performer);
+      return {};
+    case slidewell::kShow:
+      jump(performer, event);
+      return {};
+    case slidewell::kShowNext:
+    case slidewell::kShowPrevious:
+      roles::perform(shown(performer), event.command);
+      // A step brings the picture back.
+      frozenIn_ = {};
+      return {};
+    default:
+      return RoleApplication::performBy(performer, event);
+  }
+}
+
+void Presentation::start(const Performer& performer) {
+  if (showWindow(performer) != nullptr) return;
+  const auto documents = documentWindows(performer);
+  if (documents.empty()) throw Refusal{"no document is open"};
+  frozenIn_ = {};
+  const auto active = std::ranges::find_if(documents, &Window::isActive);
+  roles::perform(performer.in(active != documents.end() ? **active : *documents.front()), slidewell::kStart);
+}
+
+/// Also said to a program that shows nothing: that must not disturb whoever works on slides.
+void Presentation::stop(const Performer& performer) {
+  const Window* const window = showWindow(performer);
+  if (window == nullptr) return;
+  const Performer show = performer.in(*window);
+  // Where the picture is taken away, the first key only brings it back.
+  if (isFrozen(window)) roles::perform(show, slidewell::kStop);
+  frozenIn_ = {};
+  roles::perform(show, slidewell::kStop);
+}
+
+void Presentation::jump(const Performer& performer, const Event& event) {
+  const auto* const slide = event.direct ? std::get_if<ObjectRef>(&*event.direct) : nullptr;
+  if (slide == nullptr || slide->application != this || slide->cls != slidewell::kSlide) {
+    throw Refusal{"only slides can be shown"};
+  }
+  roles::perform(shown(performer), slide->id == kFirstSlide ? words::kFirstSlide : words::kLastSlide);
+  frozenIn_ = {};
+}
 
 }  // namespace
 
 tarnscript::Application& presentation() {
-  static Presentation thePresentation;
-  return thePresentation;
+  static Presentation application;
+  return application;
 }
 
-}  // namespace desktop
+}  // namespace linux::roles

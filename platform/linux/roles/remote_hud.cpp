@@ -3,11 +3,10 @@
 #include <cstdio>
 #include <string>
 
-#include "platform/linux/system/bus.h"
-#include "platform/linux/players/mpv_channel.h"
+#include "platform/linux/players/mpris.h"
 #include "platform/tarnscript/tarnscript.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
 
@@ -32,7 +31,7 @@ std::string timeText(std::int64_t microseconds) {
   return text;
 }
 
-std::string place(const PlayerState& state) {
+std::string place(const players::PlayerState& state) {
   return timeText(state.position) + (state.length ? " / " + timeText(*state.length) : std::string());
 }
 
@@ -45,9 +44,9 @@ int takeNumber(sd_bus_message* answer, void*, sd_bus_error*) {
 }
 
 void notify(const std::string& summary, const std::string& body, const std::string& entry) {
-  const Callee desk{"org.freedesktop.Notifications", 0};
-  const Message request =
-      makeCall(desk, {"/org/freedesktop/Notifications", "org.freedesktop.Notifications", "Notify"});
+  const system::Callee desk{"org.freedesktop.Notifications", 0};
+  const system::Message request =
+      system::makeCall(desk, {"/org/freedesktop/Notifications", "org.freedesktop.Notifications", "Notify"});
   if (request == nullptr) return;
   // Desktops have it started by its first message.
   sd_bus_message_set_auto_start(request.get(), 1);
@@ -56,23 +55,26 @@ void notify(const std::string& summary, const std::string& body, const std::stri
                             kShown) < 0) {
     return;
   }
-  sd_bus_call_async(bus(), nullptr, request.get(), takeNumber, nullptr, kCommandLimit);
+  sd_bus_call_async(system::bus(), nullptr, request.get(), takeNumber, nullptr,
+                    static_cast<std::uint64_t>(system::kCommandLimit.count()));
 }
 
 }  // namespace
 
-void showRemoteHUD(const Instance& instance) {
-  Player* const player = playerOf(instance);
+void showRemoteHUD(const Performer& performer) {
+  players::Player* const player = performer.playerIfAny();
   if (player == nullptr) return;
   try {
-    const PlayerState state = stateOf(*player);
+    const players::PlayerState state = players::stateOf(*player);
     std::string title = state.title;
-    if (title.empty()) title = instance.program != nullptr ? instance.program->name : player->name;
-    if (hasMpvChannel(instance.process) && showMpvText(instance.process, title + "\n" + place(state))) return;
-    notify(title, place(state), instance.entry);
+    if (title.empty()) title = performer.program() != nullptr ? performer.program()->name : player->name;
+    const players::ProgramChannel* const channel = performer.channel();
+    const bool shown = channel != nullptr && channel->showText != nullptr &&
+                       channel->showText(performer.listener(), title + "\n" + place(state));
+    if (!shown) notify(title, place(state), performer.instance().entry);
   } catch (const tarnscript::Refusal&) {
     // A player that does not answer has nothing to show.
   }
 }
 
-}  // namespace desktop
+}  // namespace linux::roles

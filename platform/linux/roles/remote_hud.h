@@ -1,12 +1,12 @@
 // The on-screen text with which a player answers the remote.
 #pragma once
 
-#include "platform/linux/programs/running.h"
+#include "platform/linux/roles/performer.h"
 
-namespace desktop {
+namespace linux::roles {
 
-/// Shows what the instance plays and where it stands: in its own on-screen text where it has a channel for
+/// Shows what the performer plays and where it stands: in its own on-screen text where it has a channel for
 /// that, else in a desktop notification that takes the place of the one before. Never fails and hardly waits.
-void showRemoteHUD(const Instance& instance);
+void showRemoteHUD(const Performer& performer);
 
-}  // namespace desktop
+}  // namespace linux::roles

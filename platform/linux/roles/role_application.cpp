@@ -1,63 +1,67 @@
 #include "platform/linux/roles/role_application.h"
 
-#include "platform/linux/roles/deeds.h"
 #include "platform/linux/programs/launch.h"
+#include "platform/linux/roles/perform.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
+
+using tarnscript::Code;
+using tarnscript::ObjectRef;
+using tarnscript::Value;
 
 [[noreturn]] void refuse() { throw tarnscript::Refusal{"the program cannot do that"}; }
 
 }  // namespace
 
-bool RoleApplication::running() const { return firstInstance(role_) != nullptr; }
+bool RoleApplication::running() const { return programs::isPlayed(role_); }
 
 void RoleApplication::launch() {
-  if (!running()) launchProgramOf(role_);
+  if (!running()) programs::launchProgramOf(role_);
 }
 
 void RoleApplication::activate() {
-  const Instance* const first = firstInstance(role_);
-  if (first != nullptr) {
-    bringToFront(*first);
+  if (const auto first = performerOf(role_)) {
+    programs::bringToFront(first->instance());
   } else {
-    launchProgramOf(role_);
+    programs::launchProgramOf(role_);
   }
 }
 
 void RoleApplication::deliver(bool) {}
 
-tarnscript::Value RoleApplication::get(const tarnscript::ObjectRef&, tarnscript::Code) { refuse(); }
-
-void RoleApplication::set(const tarnscript::ObjectRef&, tarnscript::Code, const tarnscript::Value&) {
-  refuse();
+Value RoleApplication::get(const ObjectRef& object, Code property) {
+  return getBy(performer(), object, property);
 }
 
-std::vector<tarnscript::ObjectRef> RoleApplication::elements(const tarnscript::ObjectRef&, tarnscript::Code) {
-  refuse();
+void RoleApplication::set(const ObjectRef& object, Code property, const Value& value) {
+  setBy(performer(), object, property, value);
 }
 
-tarnscript::ObjectRef RoleApplication::elementWithID(const tarnscript::ObjectRef&, tarnscript::Code,
-                                                     const tarnscript::Value&) {
-  refuse();
+std::vector<ObjectRef> RoleApplication::elements(const ObjectRef& object, Code cls) {
+  return elementsBy(performer(), object, cls);
 }
 
-tarnscript::Value RoleApplication::perform(const tarnscript::Event& event) {
-  desktop::perform(instance(), event.command);
+ObjectRef RoleApplication::elementWithID(const ObjectRef&, Code, const Value&) { refuse(); }
+
+Value RoleApplication::perform(const tarnscript::Event& event) { return performBy(performer(), event); }
+
+Value RoleApplication::getBy(const Performer&, const ObjectRef&, Code) { refuse(); }
+
+void RoleApplication::setBy(const Performer&, const ObjectRef&, Code, const Value&) { refuse(); }
+
+std::vector<ObjectRef> RoleApplication::elementsBy(const Performer&, const ObjectRef&, Code) { refuse(); }
+
+Value RoleApplication::performBy(const Performer& performer, const tarnscript::Event& event) {
+  roles::perform(performer, event.command);
   return {};
 }
 
-const Instance& RoleApplication::instance() const {
-  const Instance* const first = firstInstance(role_);
-  if (first == nullptr) throw tarnscript::Refusal{"it does not run"};
-  return *first;
+Performer RoleApplication::performer() const {
+  auto first = performerOf(role_);
+  if (!first) throw tarnscript::Refusal{"it does not run"};
+  return *std::move(first);
 }
 
-Player& RoleApplication::player() const {
-  Player* const player = playerOf(instance());
-  if (player == nullptr) throw tarnscript::Refusal{"its player is not on the bus"};
-  return *player;
-}
-
-}  // namespace desktop
+}  // namespace linux::roles

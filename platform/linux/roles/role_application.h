@@ -1,17 +1,17 @@
 // What the applications that scripts name have in common here: each is a role, played by whichever program
-// stands first for it when a word arrives.
+// stands first for it when an event arrives.
 #pragma once
 
 #include <vector>
 
-#include "platform/linux/programs/running.h"
+#include "platform/linux/roles/performer.h"
 #include "platform/tarnscript/tarnscript.h"
 
-namespace desktop {
+namespace linux::roles {
 
 class RoleApplication : public tarnscript::Application {
  public:
-  explicit RoleApplication(Role role) : role_(role) {}
+  explicit RoleApplication(programs::Role role) : role_(role) {}
 
   bool running() const final;
   /// Starts the role's default program and does not wait for it; nothing while one is starting.
@@ -20,33 +20,31 @@ class RoleApplication : public tarnscript::Application {
   void activate() final;
   void deliver(bool waitsForReply) final;
 
-  // The defaults refuse; commands go to their row of deeds().
-  tarnscript::Value get(const tarnscript::ObjectRef& object, tarnscript::Code property) override;
+  // Settle who performs and hand it down to the functions below; refuse when nobody plays the role.
+  tarnscript::Value get(const tarnscript::ObjectRef& object, tarnscript::Code property) final;
   void set(const tarnscript::ObjectRef& object, tarnscript::Code property,
-           const tarnscript::Value& value) override;
+           const tarnscript::Value& value) final;
   std::vector<tarnscript::ObjectRef> elements(const tarnscript::ObjectRef& object,
-                                              tarnscript::Code cls) override;
+                                              tarnscript::Code cls) final;
   tarnscript::ObjectRef elementWithID(const tarnscript::ObjectRef& object, tarnscript::Code cls,
-                                      const tarnscript::Value& id) override;
-  tarnscript::Value perform(const tarnscript::Event& event) override;
+                                      const tarnscript::Value& id) final;
+  tarnscript::Value perform(const tarnscript::Event& event) final;
 
  protected:
-  /// The program that plays the role now; throws tarnscript::Refusal when none does.
-  const Instance& instance() const;
-  /// Its player on the bus; throws tarnscript::Refusal when it has none.
-  Player& player() const;
+  // The defaults refuse; commands go to the program's actions.
+  virtual tarnscript::Value getBy(const Performer& performer, const tarnscript::ObjectRef& object,
+                                  tarnscript::Code property);
+  virtual void setBy(const Performer& performer, const tarnscript::ObjectRef& object,
+                     tarnscript::Code property, const tarnscript::Value& value);
+  virtual std::vector<tarnscript::ObjectRef> elementsBy(const Performer& performer,
+                                                        const tarnscript::ObjectRef& object,
+                                                        tarnscript::Code cls);
+  virtual tarnscript::Value performBy(const Performer& performer, const tarnscript::Event& event);
 
  private:
-  const Role role_;
+  Performer performer() const;
+
+  const programs::Role role_;
 };
 
-// One for each role that scripts speak to, each in its own file; and the keystroke helper.
-tarnscript::Application& jukebox();
-tarnscript::Application& discPlayer();
-tarnscript::Application& classicMovies();
-tarnscript::Application& modernMovies();
-tarnscript::Application& presentation();
-tarnscript::Application& photoLibrary();
-tarnscript::Application& keyhouse();
-
-}  // namespace desktop
+}  // namespace linux::roles

@@ -1,61 +1,66 @@
 #include "platform/linux/roles/show_window.h"
 
-#include <strings.h>
-
 #include <algorithm>
-#include <iterator>
-#include <string_view>
 
 #include "platform/linux/players/gtk_actions.h"
+#include "platform/linux/players/mpris.h"
+#include "platform/tarnscript/text.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
 
-/// Desktop entries of the programs that show in a window of its own, beside the one that they were in; the
-/// others make that one full screen.
-constexpr std::string_view kShowInAnotherWindow[] = {
-    "libreoffice-impress",
-    "org.kde.okular",
-    "org.gnome.gThumb",
-    "org.gnome.Shotwell",
-};
+using programs::ShowStyle;
+using windows::Window;
 
-bool showsInAnotherWindow(const Instance& instance) {
-  return instance.program != nullptr &&
-         std::find(std::begin(kShowInAnotherWindow), std::end(kShowInAnotherWindow),
-                   instance.program->entry) != std::end(kShowInAnotherWindow);
+ShowStyle styleOf(const Performer& performer) {
+  return performer.program() != nullptr ? performer.program()->show : ShowStyle::FullScreen;
 }
 
-bool isDocument(const Client& client, const Instance& instance) {
-  return !client.isDialog && (instance.program == nullptr ||
-                              strcasecmp(client.className.c_str(), instance.program->windowClass) == 0);
+bool isDocument(const Window& window, const Performer& performer) {
+  return !window.isDialog &&
+         (performer.program() == nullptr ||
+          tarnscript::equalIgnoringCase(window.className, performer.program()->windowClass));
+}
+
+/// Some tell their show as a player's status: stopped is their ordinary window.
+bool isStopped(const Performer& performer) {
+  players::Player* const player = performer.playerIfAny();
+  return player != nullptr && players::statusOf(*player) == players::PlaybackStatus::Stopped;
 }
 
 }  // namespace
 
-Window showWindow(const Instance& instance) {
-  const auto& windows = instance.windows;
-  const auto show = std::find_if(windows.begin(), windows.end(), isFullScreen);
-  if (show == windows.end()) return 0;
-  if (showsInAnotherWindow(instance)) {
-    const auto documents = documentWindows(instance);
+const Window* showWindow(const Performer& performer) {
+  const auto& windows = performer.windows();
+  const auto show = std::ranges::find_if(
+      windows, [](const Window& window) { return window.isFullScreen && window.isShown; });
+  if (show == windows.end()) return nullptr;
+  if (styleOf(performer) == ShowStyle::OwnWindow) {
+    const auto documents = documentWindows(performer);
     const bool another =
-        std::any_of(documents.begin(), documents.end(), [&](Window document) { return document != *show; });
-    return another ? *show : 0;
+        std::ranges::any_of(documents, [&](const Window* document) { return document != &*show; });
+    return another ? &*show : nullptr;
   }
   // GTK programs tell their ordinary full-screen mode.
-  return actionState(instance, "win.fullscreen") == true ? 0 : *show;
+  const Window* const front = performer.keyboardWindow();
+  return players::actionState(*front, "win.fullscreen") == true ? nullptr : &*show;
 }
 
-std::vector<Window> documentWindows(const Instance& instance) {
-  std::vector<Window> found;
-  for (const Client& client : clients()) {
-    const bool ours =
-        std::find(instance.windows.begin(), instance.windows.end(), client.window) != instance.windows.end();
-    if (ours && isDocument(client, instance)) found.push_back(client.window);
+std::vector<const Window*> documentWindows(const Performer& performer) {
+  std::vector<const Window*> found;
+  for (const Window& window : performer.windows()) {
+    if (isDocument(window, performer)) found.push_back(&window);
   }
   return found;
 }
 
-}  // namespace desktop
+bool showRuns(const Performer& performer) {
+  if (styleOf(performer) != ShowStyle::ActionState) {
+    return showWindow(performer) != nullptr && !isStopped(performer);
+  }
+  const Window* const front = performer.keyboardWindow();
+  return front != nullptr && players::actionState(*front, performer.program()->showAction) == true;
+}
+
+}  // namespace linux::roles

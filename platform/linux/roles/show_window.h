@@ -3,15 +3,19 @@
 
 #include <vector>
 
-#include "platform/linux/programs/running.h"
+#include "platform/linux/roles/performer.h"
 
-namespace desktop {
+namespace linux::roles {
 
-/// The full-screen window of a program that is a show, and not its ordinary window made full screen; 0 when
-/// there is none.
-Window showWindow(const Instance& instance);
+/// The full-screen window of a program that is a show, and not its ordinary window made full screen. Null
+/// when there is none; belongs to the performer.
+const windows::Window* showWindow(const Performer& performer);
 
-/// The windows with documents in them, topmost first: no dialogs, and none of another kind of document.
-std::vector<Window> documentWindows(const Instance& instance);
+/// The windows with documents in them, topmost first: no dialogs, and none of another kind of document. They
+/// belong to the performer.
+std::vector<const windows::Window*> documentWindows(const Performer& performer);
 
-}  // namespace desktop
+/// Whether a show runs, by what the program's row says.
+bool showRuns(const Performer& performer);
+
+}  // namespace linux::roles

@@ -9,9 +9,10 @@
 #include <utility>
 #include <vector>
 
-#include "platform/base/clock.h"
+#include "platform/base/file_descriptor.h"
+#include "platform/base/run_loop.h"
 
-using base::Nanoseconds;
+using base::Clock;
 
 /// What every event of libpulse has. One that it has freed is dead until the round of events is over.
 template <typename Callback, typename Destroy>
@@ -30,7 +31,7 @@ struct pa_io_event : PulseEvent<pa_io_event_cb_t, pa_io_event_destroy_cb_t> {
 struct pa_time_event : PulseEvent<pa_time_event_cb_t, pa_time_event_destroy_cb_t> {
   /// When it is due, as libpulse said it, and on the run loop's clock; nothing once it has fired.
   timeval wallClock{};
-  std::optional<Nanoseconds> due;
+  std::optional<Clock::time_point> due;
 };
 
 /// Called once in every round while it is enabled.
@@ -38,12 +39,9 @@ struct pa_defer_event : PulseEvent<pa_defer_event_cb_t, pa_defer_event_destroy_c
   bool enabled = true;
 };
 
-namespace desktop {
+namespace linux::sound {
 
 namespace {
-
-constexpr Nanoseconds kMillisecond = 1'000'000;
-constexpr Nanoseconds kMicrosecond = 1'000;
 
 template <typename Event>
 using Events = std::vector<std::unique_ptr<Event>>;
@@ -55,11 +53,11 @@ auto& sDeferred = *new Events<pa_defer_event>;
 
 base::Owned<base::Timer> sTimer;
 /// When that timer is due.
-std::optional<Nanoseconds> sArmed;
+std::optional<Clock::time_point> sArmed;
 
 int epollSet() {
-  static const int set = epoll_create1(EPOLL_CLOEXEC);
-  return set;
+  static const base::FileDescriptor set(epoll_create1(EPOLL_CLOEXEC));
+  return set.get();
 }
 
 // ---- A round of events
@@ -88,8 +86,8 @@ bool anythingDeferred() {
   return std::ranges::any_of(sDeferred, [](const auto& event) { return event->enabled && !event->dead; });
 }
 
-std::optional<Nanoseconds> earliestTime() {
-  std::optional<Nanoseconds> earliest;
+std::optional<Clock::time_point> earliestTime() {
+  std::optional<Clock::time_point> earliest;
   for (const auto& event : sTimes) {
     if (event->dead || !event->due) continue;
     earliest = earliest ? std::min(*earliest, *event->due) : *event->due;
@@ -104,7 +102,7 @@ void serveDeferred() {
 }
 
 void serveTimes() {
-  const Nanoseconds now = base::timeSource().now();
+  const Clock::time_point now = Clock::now();
   for (pa_time_event* event : snapshot(sTimes)) {
     if (event->dead || !event->due || *event->due > now) continue;
     event->due.reset();
@@ -138,23 +136,24 @@ void serveDescriptors(int milliseconds) {
 }
 
 void armTimer() {
-  const std::optional<Nanoseconds> earliest = earliestTime();
+  const auto earliest = earliestTime();
   if (earliest == sArmed) return;
   sArmed = earliest;
   HostInvalidateTimer(HostTimerRef(sTimer.get()));
   sTimer.reset();
   if (!earliest) return;
-  const auto serve = [](HostTimerRef, void*) { servePulse([] { return true; }, 0); };
-  sTimer.reset(new base::Timer(*earliest, base::kFarthest, serve, nullptr));
+  const auto serve = [](HostTimerRef, void*) { servePulse(); };
+  sTimer.reset(new base::Timer(earliest->time_since_epoch().count(), base::kFarthest, serve, nullptr));
   HostRunLoopAddTimer(HostRunLoopCurrent(), HostTimerRef(sTimer.get()), HostRunLoopMode::Default);
 }
 
 /// Whole milliseconds until the deadline or the next of libpulse's own times, rounded up: a wait that is too
 /// short would be a busy one.
-int untilNext(Nanoseconds deadline) {
-  const Nanoseconds next = std::min(deadline, earliestTime().value_or(deadline));
-  const Nanoseconds left = std::max<Nanoseconds>(next - base::timeSource().now(), 0);
-  return static_cast<int>((left + kMillisecond - 1) / kMillisecond);
+int untilNext(const base::Deadline& deadline) {
+  const auto earliest = earliestTime();
+  if (!earliest) return deadline.milliseconds();
+  const auto left = std::chrono::ceil<std::chrono::milliseconds>(*earliest - Clock::now());
+  return std::clamp(static_cast<int>(left.count()), 0, deadline.milliseconds());
 }
 
 void serveRound(int milliseconds) {
@@ -204,7 +203,7 @@ void restartTime(pa_time_event* event, const timeval* wallClock) {
   timeval now{};
   pa_gettimeofday(&now);
   const pa_usec_t ahead = pa_timeval_cmp(wallClock, &now) > 0 ? pa_timeval_diff(wallClock, &now) : 0;
-  event->due = base::timeSource().now() + static_cast<Nanoseconds>(ahead) * kMicrosecond;
+  event->due = Clock::now() + std::chrono::microseconds(ahead);
 }
 
 pa_time_event* newTime(pa_mainloop_api*, const timeval* wallClock, pa_time_event_cb_t callback,
@@ -230,7 +229,7 @@ void setDestroy(Event* event, Callback callback) {
 
 /// Puts libpulse's events on the run loop; the source is never taken off.
 void addSource() {
-  auto* source = new base::Source(epollSet(), 0, [] { servePulse([] { return true; }, 0); });
+  auto* source = new base::Source(epollSet(), 0, [] { servePulse(); });
   source->immortal = true;
   source->prepare = anythingDeferred;
   HostRunLoopAddSource(HostRunLoopCurrent(), HostSourceRef(source), HostRunLoopMode::Default);
@@ -260,10 +259,10 @@ pa_mainloop_api& pulseLoop() {
   return api;
 }
 
-bool servePulse(const std::function<bool()>& done, Nanoseconds deadline) {
+bool servePulse(const std::function<bool()>& done, const base::Deadline& deadline) {
   serveRound(0);
   bool isDone = done();
-  while (!isDone && base::timeSource().now() < deadline) {
+  while (!isDone && !deadline.hasPassed()) {
     serveRound(untilNext(deadline));
     isDone = done();
   }
@@ -271,4 +270,9 @@ bool servePulse(const std::function<bool()>& done, Nanoseconds deadline) {
   return isDone;
 }
 
-}  // namespace desktop
+void servePulse() {
+  serveRound(0);
+  armTimer();
+}
+
+}  // namespace linux::sound

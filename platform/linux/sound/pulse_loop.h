@@ -10,15 +10,18 @@
 
 #include <functional>
 
-#include "platform/base/run_loop.h"
+#include "platform/base/deadline.h"
 
-namespace desktop {
+namespace linux::sound {
 
 /// What libpulse is given to live on. Borrowed; it lives as long as the process.
 pa_mainloop_api& pulseLoop();
 
-/// Serves libpulse's events until `done` says so or the deadline, on the run loop's clock, has passed; what
-/// is ready already is always served. Returns what `done` said last.
-bool servePulse(const std::function<bool()>& done, base::Nanoseconds deadline);
+/// Serves libpulse's events until `done` says so or the deadline has passed; what is ready already is always
+/// served. Returns what `done` said last.
+bool servePulse(const std::function<bool()>& done, const base::Deadline& deadline);
 
-}  // namespace desktop
+/// Serves the events of libpulse that are ready, without waiting.
+void servePulse();
+
+}  // namespace linux::sound

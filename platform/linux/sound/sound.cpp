@@ -11,15 +11,15 @@
 #include <memory>
 #include <string>
 
-#include "platform/base/clock.h"
+#include "platform/base/run_loop.h"
 #include "platform/linux/sound/pulse_loop.h"
 #include "platform/linux/system/turn.h"
 
-namespace desktop {
+namespace linux::sound {
 
 namespace {
 
-using base::Nanoseconds;
+using base::Deadline;
 
 /// What every server takes for the sink that is the default one at that moment.
 constexpr char kDefaultSink[] = "@DEFAULT_SINK@";
@@ -38,10 +38,6 @@ Context sContext;
 /// The turn in which a connection was last made or tried.
 std::optional<std::uint64_t> sTried;
 
-Nanoseconds deadlineIn(Microseconds limit) {
-  return base::timeSource().now() + static_cast<Nanoseconds>(limit) * 1'000;
-}
-
 // ---- The connection
 
 bool isGood(const pa_context* context) {
@@ -51,9 +47,9 @@ bool isGood(const pa_context* context) {
 bool isReady(const pa_context* context) { return pa_context_get_state(context) == PA_CONTEXT_READY; }
 
 /// A connection that is ready; null when there is no server, or none that answers before the deadline.
-pa_context* connection(Nanoseconds deadline) {
+pa_context* connection(const Deadline& deadline) {
   // A server that has gone is seen by reading what it left.
-  if (isGood(sContext.get())) servePulse([] { return true; }, deadline);
+  if (isGood(sContext.get())) servePulse();
   if (isGood(sContext.get())) return sContext.get();
   sContext.reset();
   if (sTried == base::turn()) return nullptr;
@@ -83,7 +79,7 @@ enum class Result { Pending, Failed, Done };
 using Operation = std::function<pa_operation*(pa_context* context, Result& result)>;
 
 /// Runs an operation on the server to its end, a second time on a new connection where the first was lost.
-bool run(const Operation& operation, Nanoseconds deadline) {
+bool run(const Operation& operation, const Deadline& deadline) {
   while (pa_context* const context = connection(deadline)) {
     Result result = Result::Pending;
     pa_operation* const running = operation(context, result);
@@ -127,7 +123,7 @@ void noteSink(pa_context*, const pa_sink_info* info, int end, void* data) {
   *sink.result = Result::Done;
 }
 
-std::optional<Sink> defaultSink(Nanoseconds deadline) {
+std::optional<Sink> defaultSink(const Deadline& deadline) {
   Sink sink;
   const Operation ask = [&](pa_context* context, Result& result) {
     sink.result = &result;
@@ -167,14 +163,16 @@ pa_cvolume scaled(const Sink& sink, pa_volume_t loudest) {
 
 }  // namespace
 
+void finish() { sContext.reset(); }
+
 std::optional<SoundState> soundState() {
-  const auto sink = defaultSink(deadlineIn(kQueryLimit));
+  const auto sink = defaultSink(Deadline(system::kQueryLimit));
   if (!sink) return std::nullopt;
   return SoundState{toPercent(pa_cvolume_max(&sink->volume)), sink->muted};
 }
 
 bool setOutputVolume(int percent) {
-  const Nanoseconds deadline = deadlineIn(kCommandLimit);
+  const Deadline deadline(system::kCommandLimit);
   const auto sink = defaultSink(deadline);
   if (!sink) return false;
   const pa_cvolume volume = scaled(*sink, fromPercent(percent));
@@ -190,7 +188,7 @@ bool setOutputMuted(bool muted) {
       [&](pa_context* context, Result& result) {
         return pa_context_set_sink_mute_by_name(context, kDefaultSink, muted ? 1 : 0, noteSuccess, &result);
       },
-      deadlineIn(kCommandLimit));
+      Deadline(system::kCommandLimit));
 }
 
-}  // namespace desktop
+}  // namespace linux::sound

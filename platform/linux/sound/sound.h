@@ -7,13 +7,16 @@
 
 #include <optional>
 
-namespace desktop {
+namespace linux::sound {
 
 struct SoundState {
   /// The loudest channel, in percent as volume sliders show it, 0 to 100. What is amplified reads as 100.
   int volume = 0;
   bool muted = false;
 };
+
+/// Closes the connection; a later question makes a new one.
+void finish();
 
 /// The default sink's; nothing without a server, without a sink, or when no answer comes in time.
 std::optional<SoundState> soundState();
@@ -25,4 +28,4 @@ bool setOutputVolume(int percent);
 /// Mutes or unmutes the default sink. False where soundState would be nothing.
 bool setOutputMuted(bool muted);
 
-}  // namespace desktop
+}  // namespace linux::sound

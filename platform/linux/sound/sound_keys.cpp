@@ -3,10 +3,10 @@
 #include <algorithm>
 #include <cstdint>
 
-#include "platform/linux/system/bus.h"
 #include "platform/linux/sound/sound.h"
+#include "platform/linux/system/bus.h"
 
-namespace desktop {
+namespace linux::sound {
 
 namespace {
 
@@ -22,17 +22,17 @@ const char* iconOf(const SoundState& sound) {
 /// waits for.
 bool showOnGnome(const SoundState& sound) {
   constexpr char kName[] = "org.gnome.Shell";
-  if (!nameHasOwner(kName)) return false;
-  return send({kName}, {"/org/gnome/Shell", kName, "ShowOSD"}, "a{sv}", 2, "icon", "s", iconOf(sound),
-              "level", "d", sound.muted ? 0.0 : sound.volume / 100.0);
+  if (!system::nameHasOwner(kName)) return false;
+  return system::send({kName}, {"/org/gnome/Shell", kName, "ShowOSD"}, "a{sv}", 2, "icon", "s", iconOf(sound),
+                      "level", "d", sound.muted ? 0.0 : sound.volume / 100.0);
 }
 
 /// It shows 0 as muted.
 bool showOnPlasma(const SoundState& sound) {
   constexpr char kName[] = "org.kde.plasmashell";
-  if (!nameHasOwner(kName)) return false;
-  return send({kName}, {"/org/kde/osdService", "org.kde.osdService", "volumeChanged"}, "i",
-              std::int32_t{sound.muted ? 0 : sound.volume});
+  if (!system::nameHasOwner(kName)) return false;
+  return system::send({kName}, {"/org/kde/osdService", "org.kde.osdService", "volumeChanged"}, "i",
+                      std::int32_t{sound.muted ? 0 : sound.volume});
 }
 
 }  // namespace
@@ -47,4 +47,4 @@ void pressSoundKey(const base::SoundKey& key) {
   if (!showOnGnome(*sound)) showOnPlasma(*sound);
 }
 
-}  // namespace desktop
+}  // namespace linux::sound

@@ -8,7 +8,7 @@
 #include "platform/base/run_loop.h"
 #include "platform/host.h"
 
-namespace desktop {
+namespace linux::system {
 
 namespace {
 
@@ -20,9 +20,10 @@ unsigned sGeneration = 0;
 /// The turn in which a connection was last tried.
 std::optional<std::uint64_t> sTried;
 
-Microseconds now() {
+/// On the clock that sd_bus_get_timeout counts on, in microseconds.
+std::uint64_t monotonicTime() {
   using std::chrono::steady_clock;
-  return static_cast<Microseconds>(
+  return static_cast<std::uint64_t>(
       std::chrono::duration_cast<std::chrono::microseconds>(steady_clock::now().time_since_epoch()).count());
 }
 
@@ -31,7 +32,7 @@ void putOnLoop(sd_bus* connection) {
   // What sd-bus has read while it waited for an answer no longer shows on the descriptor.
   sSource->prepare = [connection] {
     std::uint64_t timeout = 0;
-    return sd_bus_get_timeout(connection, &timeout) >= 0 && timeout <= now();
+    return sd_bus_get_timeout(connection, &timeout) >= 0 && timeout <= monotonicTime();
   };
   HostRunLoopAddSource(HostRunLoopCurrent(), HostSourceRef(sSource.get()), HostRunLoopMode::Default);
 }
@@ -44,15 +45,20 @@ void loseConnection() {
   sBus = sd_bus_close_unref(sBus);
 }
 
+/// False when nothing came before the deadline.
+bool waitFor(sd_bus* connection, const base::Deadline& deadline) {
+  const auto left = std::chrono::ceil<Limit>(deadline.left());
+  return sd_bus_wait(connection, static_cast<std::uint64_t>(left.count())) > 0;
+}
+
 /// Waits until the bus has let us in; sd-bus itself would wait for ever.
 bool becomesReady(sd_bus* connection) {
-  const Microseconds deadline = now() + kCommandLimit;
+  const base::Deadline deadline(kCommandLimit);
   while (sd_bus_is_ready(connection) == 0) {
     const int done = sd_bus_process(connection, nullptr);
     if (done < 0) return false;
     if (done > 0) continue;
-    const Microseconds present = now();
-    if (present >= deadline || sd_bus_wait(connection, deadline - present) < 0) return false;
+    if (!waitFor(connection, deadline)) return false;
   }
   return sd_bus_is_ready(connection) > 0;
 }
@@ -80,6 +86,11 @@ sd_bus* bus() {
   return sBus;
 }
 
+void closeBus() {
+  if (sBus != nullptr) sd_bus_flush(sBus);
+  loseConnection();
+}
+
 unsigned busGeneration() { return sGeneration; }
 
 void takeInBus() {
@@ -91,6 +102,8 @@ void takeInBus() {
   // Busy means that this was called from a handler of a message, which the caller up there goes on with.
   if (done < 0 && done != -EBUSY) loseConnection();
 }
+
+bool waitForBus(const base::Deadline& deadline) { return sBus != nullptr && waitFor(sBus, deadline); }
 
 Message makeCall(const Callee& callee, const Method& method) {
   sd_bus* const connection = bus();
@@ -104,11 +117,11 @@ Message makeCall(const Callee& callee, const Method& method) {
   return Message(request);
 }
 
-Message call(const Callee& callee, Message request, Microseconds limit) {
+Message call(const Callee& callee, Message request, Limit limit) {
   if (request == nullptr || timedOutThisTurn(callee.process)) return nullptr;
   sd_bus_message* answer = nullptr;
-  const int result =
-      sd_bus_call(sd_bus_message_get_bus(request.get()), request.get(), limit, nullptr, &answer);
+  const int result = sd_bus_call(sd_bus_message_get_bus(request.get()), request.get(),
+                                 static_cast<std::uint64_t>(limit.count()), nullptr, &answer);
   if (result == -ETIMEDOUT) noteTimeout(callee.process);
   return Message(result < 0 ? nullptr : answer);
 }
@@ -135,4 +148,4 @@ pid_t processBehind(const char* name) {
   return static_cast<pid_t>(process);
 }
 
-}  // namespace desktop
+}  // namespace linux::system

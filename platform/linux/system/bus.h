@@ -1,7 +1,7 @@
 // The session bus, through sd-bus.
 //
-// The connection is made at the start and made again, at most once a turn of the run loop, when it was lost
-// and something needs it. Signals are taken in by the run loop, and by takeInBus() before a question that
+// The connection is made when it is first needed and made again, at most once a turn of the run loop, after
+// it was lost. Signals are taken in by the run loop, and by takeInBus() before a question that
 // must see all that has been sent.
 #pragma once
 
@@ -10,9 +10,10 @@
 #include <memory>
 #include <string>
 
+#include "platform/base/deadline.h"
 #include "platform/linux/system/turn.h"
 
-namespace desktop {
+namespace linux::system {
 
 struct MessageReleaser {
   void operator()(sd_bus_message* message) const { sd_bus_message_unref(message); }
@@ -22,12 +23,19 @@ using Message = std::unique_ptr<sd_bus_message, MessageReleaser>;
 /// The connection; null while there is no session bus. Borrowed.
 sd_bus* bus();
 
+/// Sends what is still on its way and closes the connection; a later question makes a new one.
+void closeBus();
+
 /// Counts the connections made: whoever keeps something that a connection knew (matches, the names on the
 /// bus) begins anew when it changes.
 unsigned busGeneration();
 
 /// Handles every message that has arrived, without waiting.
 void takeInBus();
+
+/// Waits until something has come that takeInBus would handle. False when the deadline has passed first, or
+/// there is no connection.
+bool waitForBus(const base::Deadline& deadline);
 
 /// Who is called. The process is 0 where a time-out of one call should not silence others.
 struct Callee {
@@ -47,14 +55,14 @@ Message makeCall(const Callee& callee, const Method& method);
 
 /// Sends a call and waits for its answer. Null on an error, on a time-out, and at once when the process has
 /// timed out in this turn.
-Message call(const Callee& callee, Message request, Microseconds limit);
+Message call(const Callee& callee, Message request, Limit limit);
 
 /// Sends a call whose answer nobody waits for. False when it could not be queued.
 bool send(Message request);
 
 /// Calls with arguments as sd_bus_message_append takes them; types is their signature, "" for none.
 template <typename... Arguments>
-Message call(const Callee& callee, const Method& method, Microseconds limit, const char* types,
+Message call(const Callee& callee, const Method& method, Limit limit, const char* types,
              Arguments... arguments) {
   Message request = makeCall(callee, method);
   if (request == nullptr || sd_bus_message_append(request.get(), types, arguments...) < 0) return nullptr;
@@ -75,4 +83,4 @@ bool nameHasOwner(const char* name);
 /// The process behind a bus name; 0 when it is not known.
 pid_t processBehind(const char* name);
 
-}  // namespace desktop
+}  // namespace linux::system

@@ -3,7 +3,7 @@
 #include <cmath>
 #include <cstdint>
 
-namespace desktop {
+namespace linux::system {
 
 namespace {
 
@@ -55,4 +55,4 @@ std::optional<bool> readBoolean(sd_bus_message* message, std::string_view type) 
   return *value != 0;
 }
 
-}  // namespace desktop
+}  // namespace linux::system

@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-namespace desktop {
+namespace linux::system {
 
 /// The longest text that is kept, in bytes: a title, an address.
 inline constexpr std::size_t kLongestText = 4096;
@@ -41,4 +41,4 @@ void readDictionary(sd_bus_message* message, Take take) {
   sd_bus_message_exit_container(message);
 }
 
-}  // namespace desktop
+}  // namespace linux::system

@@ -9,24 +9,30 @@
 #include <string>
 #include <string_view>
 
+#include "platform/base/deadline.h"
+#include "platform/base/file_descriptor.h"
 #include "platform/linux/system/turn.h"
 
-namespace desktop {
+namespace linux::system {
 
-/// The path on which a process that runs this executable listens; empty when it does not.
-std::string channelPath(pid_t process, std::string_view executable);
+/// Who listens: a process, and the name of the executable that it must be running.
+struct Listener {
+  pid_t process = 0;
+  std::string_view executable;
+};
+
+/// The path on which it listens; empty when it does not.
+std::string channelPath(const Listener& listener);
 
 /// A connection for one exchange.
 class Channel {
  public:
-  /// Connects. Not open when nobody takes the connection, and at once when the process has timed out in this
-  /// turn. The limit is for the whole exchange.
-  Channel(pid_t process, std::string_view executable, Microseconds limit);
-  ~Channel();
-  Channel(const Channel&) = delete;
-  Channel& operator=(const Channel&) = delete;
+  /// Connects. Not open when nobody takes the connection, or somebody else, and at once when the process has
+  /// timed out in this turn. The limit is for the whole exchange; letting it run out counts as a time-out of
+  /// the process only where the caller says so (noteTimeout).
+  Channel(const Listener& listener, Limit limit);
 
-  bool isOpen() const { return socket_ >= 0; }
+  bool isOpen() const { return static_cast<bool>(socket_); }
   /// Sends a text whole; false when it does not get through.
   bool write(std::string_view text);
   /// The next line that comes, without its end; nothing at the end and when the time is up.
@@ -37,11 +43,10 @@ class Channel {
  private:
   bool waitFor(short events);
 
-  /// On the clock of HostAbsoluteTime.
-  const double deadline_;
-  int socket_ = -1;
+  const base::Deadline deadline_;
+  base::FileDescriptor socket_;
   bool timedOut_ = false;
   std::string received_;
 };
 
-}  // namespace desktop
+}  // namespace linux::system

@@ -7,13 +7,14 @@
 #include <charconv>
 #include <cstdint>
 #include <fstream>
+#include <iterator>
 #include <memory>
 #include <optional>
 #include <set>
 #include <sstream>
 #include <string_view>
 
-namespace desktop {
+namespace linux::system {
 
 namespace {
 
@@ -63,6 +64,21 @@ std::string executableName(pid_t process) {
   return path.substr(path.rfind('/') + 1);
 }
 
+std::uint32_t startTime(pid_t process) {
+  constexpr int kFieldsBefore =
+      19;  // between the name, which may hold anything but ends with the last ')', and it
+  std::ifstream file("/proc/" + std::to_string(process) + "/stat");
+  const std::string text(std::istreambuf_iterator<char>(file), {});
+  const std::size_t end = text.rfind(')');
+  if (end == std::string::npos) return 0;
+  std::istringstream rest(text.substr(end + 1));
+  std::string field;
+  for (int i = 0; i < kFieldsBefore; ++i) rest >> field;
+  std::uint64_t ticks = 0;
+  rest >> ticks;
+  return static_cast<std::uint32_t>(ticks);
+}
+
 std::vector<std::string> listeningSockets(pid_t process) {
   std::vector<std::string> paths;
   const std::set<Inode> sockets = socketsOf(process);
@@ -84,4 +100,4 @@ std::vector<std::string> listeningSockets(pid_t process) {
   return paths;
 }
 
-}  // namespace desktop
+}  // namespace linux::system

@@ -1,10 +1,11 @@
 #include "platform/linux/system/turn.h"
 
+#include <cstdint>
 #include <set>
 
 #include "platform/base/run_loop.h"
 
-namespace desktop {
+namespace linux::system {
 
 namespace {
 
@@ -30,4 +31,4 @@ bool timedOutThisTurn(pid_t process) {
   return sTimedOut.contains(process);
 }
 
-}  // namespace desktop
+}  // namespace linux::system

@@ -6,16 +6,16 @@
 
 #include <sys/types.h>
 
-#include <cstdint>
+#include <chrono>
 
-namespace desktop {
+namespace linux::system {
 
-/// Microseconds.
-using Microseconds = std::uint64_t;
+/// How long something may be waited for.
+using Limit = std::chrono::microseconds;
 
 /// The longest wait for the answer to a question, and for the acknowledgement of a command.
-inline constexpr Microseconds kQueryLimit = 500'000;
-inline constexpr Microseconds kCommandLimit = 1'000'000;
+inline constexpr Limit kQueryLimit = std::chrono::milliseconds(500);
+inline constexpr Limit kCommandLimit = std::chrono::seconds(1);
 
 /// Notes that the process has let a wait run out.
 void noteTimeout(pid_t process);
@@ -24,4 +24,4 @@ void noteTimeout(pid_t process);
 /// interest.
 bool timedOutThisTurn(pid_t process);
 
-}  // namespace desktop
+}  // namespace linux::system

@@ -2,20 +2,21 @@
 
 #include <algorithm>
 
-namespace desktop {
+#include "platform/linux/windows/keysyms.h"
+#include "platform/linux/windows/windows.h"
 
-Window keyboardWindow(const Instance& instance) {
-  const auto isOurs = [&](Window window) {
-    return std::find(instance.windows.begin(), instance.windows.end(), window) != instance.windows.end();
-  };
-  if (isOurs(activeWindow())) return activeWindow();
-  const auto full = std::find_if(instance.windows.begin(), instance.windows.end(), isFullScreen);
-  if (full != instance.windows.end()) return *full;
-  return instance.windows.empty() ? 0 : instance.windows.front();
+namespace linux::windows {
+
+const Window* keyboardWindow(std::span<const Window> windows) {
+  const auto active = std::ranges::find_if(windows, &Window::isActive);
+  if (active != windows.end()) return &*active;
+  const auto full =
+      std::ranges::find_if(windows, [](const Window& each) { return each.isFullScreen && each.isShown; });
+  if (full != windows.end()) return &*full;
+  return windows.empty() ? nullptr : &windows.front();
 }
 
-bool type(const Instance& instance, std::string_view keys) {
-  const Window window = keyboardWindow(instance);
+bool type(ID window, std::string_view keys) {
   bool first = true;
   while (!keys.empty()) {
     const std::size_t end = keys.find(' ');
@@ -30,4 +31,4 @@ bool type(const Instance& instance, std::string_view keys) {
   return !first;
 }
 
-}  // namespace desktop
+}  // namespace linux::windows

@@ -1,18 +1,19 @@
 // Typing into a program, in front or not.
 #pragma once
 
-#include "platform/linux/windows/keysyms.h"
-#include "platform/linux/programs/running.h"
+#include <span>
+#include <string_view>
 
-namespace desktop {
+#include "platform/linux/windows/window.h"
 
-/// The window of the program that a person would type into: the active one if it is the program's, else a
-/// full-screen one, else the topmost. 0 when it has none.
-Window keyboardWindow(const Instance& instance);
+namespace linux::windows {
 
-/// Presses and releases keys in that window, one after another: texts as parseKey reads them, one blank
-/// apart. False when the first of them is no key, or one that the keyboard has not, or the program has no
-/// window.
-bool type(const Instance& instance, std::string_view keys);
+/// Of a program's windows, topmost first, the one that a person would type into: the active one, else a
+/// full-screen one, else the topmost. Null when there is none. Borrowed.
+const Window* keyboardWindow(std::span<const Window> windows);
 
-}  // namespace desktop
+/// Presses and releases keys in a window, one after another: texts as parseKey reads them, one blank apart.
+/// False when the first of them is no key, or one that the keyboard has not, or the window cannot be reached.
+bool type(ID window, std::string_view keys);
+
+}  // namespace linux::windows

@@ -4,7 +4,7 @@
 #include <iterator>
 #include <utility>
 
-namespace desktop {
+namespace linux::windows {
 
 namespace {
 
@@ -74,7 +74,7 @@ std::optional<KeyStroke> parseKey(std::string_view text) {
     for (const auto& [name, modifier] : kModifiers) {
       if (!text.starts_with(name)) continue;
       text.remove_prefix(name.size());
-      stroke.modifiers |= modifier;
+      stroke.modifiers = static_cast<Modifiers>(stroke.modifiers | modifier);
       found = true;
     }
   }
@@ -83,4 +83,4 @@ std::optional<KeyStroke> parseKey(std::string_view text) {
   return stroke;
 }
 
-}  // namespace desktop
+}  // namespace linux::windows

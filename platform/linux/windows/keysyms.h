@@ -1,18 +1,18 @@
-// Keys by their names: the virtual key codes that the core presses, and the key texts of deeds.
+// Keys by their names: the virtual key codes that the core presses, and the key texts of the programs' table.
 #pragma once
 
 #include <cstdint>
 #include <optional>
 #include <string_view>
 
-#include "platform/linux/windows/x11/x11.h"
+#include "platform/linux/windows/backend.h"
 
-namespace desktop {
+namespace linux::windows {
 
-/// A key with the modifiers held meanwhile.
+/// A key, an X keysym, with the modifiers held meanwhile.
 struct KeyStroke {
   std::uint32_t keysym = 0;
-  std::uint16_t modifiers = kNoModifier;
+  Modifiers modifiers = kNoModifier;
 };
 
 /// The virtual key code of Shift, which is a modifier and not a key of its own.
@@ -25,4 +25,4 @@ std::uint32_t keysymOf(std::uint16_t virtualKey);
 /// prefix, or one printable ASCII character. Nothing when the text is no such key.
 std::optional<KeyStroke> parseKey(std::string_view text);
 
-}  // namespace desktop
+}  // namespace linux::windows

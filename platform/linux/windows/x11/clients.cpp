@@ -1,39 +1,26 @@
-#include "platform/linux/windows/x11/x11.h"
+#include "platform/linux/windows/x11/clients.h"
 
 #include <xcb/res.h>
 
 #include <algorithm>
-#include <array>
 #include <optional>
-#include <string_view>
 
-#include "platform/base/run_loop.h"
 #include "platform/linux/windows/x11/connection.h"
+#include "platform/linux/windows/x11/x11.h"
 
-namespace desktop {
+namespace linux::windows::x11 {
 
 namespace {
 
-using x::askProperty;
-using x::atom;
-using x::await;
-using x::awaitText;
-using x::Numbers;
-
-/// The office's windows change their class with the document in them.
-constexpr std::string_view kChangingClass = "libreoffice";
+/// On every desktop of the window manager.
+constexpr std::uint32_t kEveryDesktop = 0xFFFFFFFF;
 
 /// What is known of the windows, as far as the events told.
-struct Knowledge {
-  std::vector<Client> clients;
-  Window active = XCB_NONE;
-  /// x::changes().windows when it was read.
-  unsigned changes = 0;
-  /// The turn in which classes that change were last looked at.
-  std::optional<std::uint64_t> classesRead;
-};
+std::vector<Window> sClients;
+/// changes().windows when it was read.
+unsigned sChanges = 0;
 
-Knowledge sKnown;
+xcb_window_t numberOf(const Window& window) { return static_cast<xcb_window_t>(window.id.number); }
 
 /// The process that connected, from the answer to the one question asked about it; 0 where the server does
 /// not tell.
@@ -48,6 +35,14 @@ pid_t connectedProcess(const xcb_res_query_client_ids_reply_t& reply) {
   return 0;
 }
 
+void setClass(Window& window, const std::string& both) {
+  const std::size_t end = both.find('\0');
+  window.instanceName = both.substr(0, end);
+  window.className = end != std::string::npos ? firstText(both.substr(end + 1)) : std::string();
+}
+
+// ---- Who a window is
+
 struct IdentityCookies {
   xcb_get_property_cookie_t windowClass;
   xcb_get_property_cookie_t application;
@@ -56,108 +51,133 @@ struct IdentityCookies {
   std::optional<xcb_res_query_client_ids_cookie_t> connected;
 };
 
-IdentityCookies askIdentity(xcb_connection_t* server, Window window) {
-  IdentityCookies cookies{
-      askProperty(window, XCB_ATOM_WM_CLASS), askProperty(window, atom(x::GtkApplicationId)),
-      askProperty(window, XCB_ATOM_WM_TRANSIENT_FOR), askProperty(window, atom(x::NetWmPid)), std::nullopt};
-  if (x::hasResource()) {
+IdentityCookies askIdentity(xcb_connection_t* server, xcb_window_t window) {
+  IdentityCookies cookies{askProperty(window, XCB_ATOM_WM_CLASS), askProperty(window, atom(GtkApplicationId)),
+                          askProperty(window, XCB_ATOM_WM_TRANSIENT_FOR), askProperty(window, atom(NetWmPid)),
+                          std::nullopt};
+  if (hasResource()) {
     const xcb_res_client_id_spec_t spec{window, XCB_RES_CLIENT_ID_MASK_LOCAL_CLIENT_PID};
     cookies.connected = xcb_res_query_client_ids(server, 1, &spec);
   }
   return cookies;
 }
 
-Client awaitIdentity(Window window, const IdentityCookies& cookies) {
-  Client client;
-  client.window = window;
-  const std::string both = awaitText(cookies.windowClass);
-  const std::size_t end = both.find('\0');
-  client.instanceName = both.substr(0, end);
-  if (end != std::string::npos) client.className = both.substr(end + 1, both.find('\0', end + 1) - end - 1);
-  client.applicationID = awaitText(cookies.application);
-  client.isDialog = Numbers(cookies.owner).first(XCB_NONE) != XCB_NONE;
-  client.process = static_cast<pid_t>(Numbers(cookies.process).first(0));
-  if (!cookies.connected) return client;
+Window awaitIdentity(xcb_window_t number, const IdentityCookies& cookies) {
+  Window window;
+  window.id = {&kBackend, number};
+  setClass(window, awaitText(cookies.windowClass));
+  window.applicationID = awaitText(cookies.application);
+  window.isDialog = Numbers(cookies.owner).first(XCB_NONE) != XCB_NONE;
+  window.process = static_cast<pid_t>(Numbers(cookies.process).first(0));
+  if (!cookies.connected) return window;
+  // A window may say any process; the server knows who connected.
   const auto connected = await<xcb_res_query_client_ids_reply_t>(*cookies.connected);
   const pid_t process = connected != nullptr ? connectedProcess(*connected) : 0;
-  if (process != 0) client.process = process;
-  return client;
+  if (process != 0) window.process = process;
+  return window;
 }
 
-std::vector<Client> identify(xcb_connection_t* server, const std::vector<Window>& windows) {
+std::vector<Window> identify(xcb_connection_t* server, const std::vector<xcb_window_t>& numbers) {
   std::vector<IdentityCookies> cookies;
-  cookies.reserve(windows.size());
-  for (const Window window : windows) cookies.push_back(askIdentity(server, window));
-  std::vector<Client> clients;
-  for (std::size_t i = 0; i < windows.size(); ++i) clients.push_back(awaitIdentity(windows[i], cookies[i]));
-  return clients;
-}
-
-bool sameClient(const Client& a, const Client& b) {
-  return a.window == b.window && a.process == b.process && a.instanceName == b.instanceName &&
-         a.className == b.className && a.applicationID == b.applicationID && a.isDialog == b.isDialog;
+  cookies.reserve(numbers.size());
+  for (const xcb_window_t number : numbers) cookies.push_back(askIdentity(server, number));
+  std::vector<Window> windows;
+  for (std::size_t i = 0; i < numbers.size(); ++i) windows.push_back(awaitIdentity(numbers[i], cookies[i]));
+  return windows;
 }
 
 /// The managed windows, topmost first, or the newest first where the window manager does not tell the order.
-std::vector<Window> topmostFirst(const Numbers& stacking, const Numbers& byAge) {
+std::vector<xcb_window_t> topmostFirst(const Numbers& stacking, const Numbers& byAge) {
   const auto listed = stacking.values().empty() ? byAge.values() : stacking.values();
   return {listed.rbegin(), listed.rend()};
 }
 
-/// Replaces the clients; true when that changed something.
-bool know(std::vector<Client> clients) {
-  const bool changed =
-      !std::equal(clients.begin(), clients.end(), sKnown.clients.begin(), sKnown.clients.end(), sameClient);
-  sKnown.clients = std::move(clients);
-  return changed;
-}
-
-bool readEverything(xcb_connection_t* server) {
-  sKnown.changes = x::changes().windows;
-  const auto stackingCookie = askProperty(x::root(), atom(x::NetClientListStacking));
-  const auto byAgeCookie = askProperty(x::root(), atom(x::NetClientList));
-  const auto activeCookie = askProperty(x::root(), atom(x::NetActiveWindow));
+std::vector<Window> readClients(xcb_connection_t* server) {
+  const auto stackingCookie = askProperty(root(), atom(NetClientListStacking));
+  const auto byAgeCookie = askProperty(root(), atom(NetClientList));
+  const auto activeCookie = askProperty(root(), atom(NetActiveWindow));
   const Numbers stacking(stackingCookie);
   const Numbers byAge(byAgeCookie);
-  sKnown.active = Numbers(activeCookie).first(XCB_NONE);
-  sKnown.classesRead = base::turn();
-  return know(identify(server, topmostFirst(stacking, byAge)));
+  const xcb_window_t active = Numbers(activeCookie).first(XCB_NONE);
+  std::vector<Window> windows = identify(server, topmostFirst(stacking, byAge));
+  for (Window& window : windows) window.isActive = numberOf(window) == active;
+  return windows;
 }
 
-bool hasChangingClass(const Client& client) { return client.className.starts_with(kChangingClass); }
+// ---- How a window looks
 
-bool readChangingClasses(xcb_connection_t* server) {
-  if (sKnown.classesRead == base::turn()) return false;
-  sKnown.classesRead = base::turn();
-  std::vector<Window> windows;
-  for (const Client& client : sKnown.clients) {
-    if (hasChangingClass(client)) windows.push_back(client.window);
-  }
-  if (windows.empty()) return false;
-  std::vector<Client> clients = sKnown.clients;
-  for (Client& fresh : identify(server, windows)) {
-    const auto known = std::find_if(clients.begin(), clients.end(),
-                                    [&](const Client& client) { return client.window == fresh.window; });
-    *known = std::move(fresh);
-  }
-  return know(std::move(clients));
+struct LookCookies {
+  xcb_get_property_cookie_t windowClass;
+  xcb_get_property_cookie_t title;
+  xcb_get_property_cookie_t busName;
+  xcb_get_property_cookie_t applicationPath;
+  xcb_get_property_cookie_t windowPath;
+  xcb_get_property_cookie_t state;
+  xcb_get_property_cookie_t desktop;
+  xcb_get_window_attributes_cookie_t attributes;
+  xcb_get_geometry_cookie_t size;
+  xcb_translate_coordinates_cookie_t place;
+};
+
+LookCookies askLook(xcb_connection_t* server, xcb_window_t window) {
+  return {
+      askProperty(window, XCB_ATOM_WM_CLASS),
+      askProperty(window, atom(NetWmName)),
+      askProperty(window, atom(GtkUniqueBusName)),
+      askProperty(window, atom(GtkApplicationObjectPath)),
+      askProperty(window, atom(GtkWindowObjectPath)),
+      askProperty(window, atom(NetWmState)),
+      askProperty(window, atom(NetWmDesktop)),
+      xcb_get_window_attributes(server, window),
+      xcb_get_geometry(server, window),
+      xcb_translate_coordinates(server, window, root(), 0, 0),
+  };
+}
+
+void awaitLook(Window& window, const LookCookies& cookies, std::uint32_t currentDesktop) {
+  setClass(window, awaitText(cookies.windowClass));
+  window.title = firstText(awaitText(cookies.title));
+  window.gtk = {firstText(awaitText(cookies.busName)), firstText(awaitText(cookies.applicationPath)),
+                firstText(awaitText(cookies.windowPath))};
+  const Numbers state(cookies.state);
+  window.isFullScreen = state.contains(atom(NetWmStateFullscreen)) && !state.contains(atom(NetWmStateHidden));
+  const std::uint32_t desktop = Numbers(cookies.desktop).first(kEveryDesktop);
+  const auto attributes = await<xcb_get_window_attributes_reply_t>(cookies.attributes);
+  // Viewable is mapped with all that it is in.
+  window.isShown = attributes != nullptr && attributes->map_state == XCB_MAP_STATE_VIEWABLE &&
+                   (desktop == currentDesktop || desktop == kEveryDesktop || currentDesktop == kEveryDesktop);
+  const auto size = await<xcb_get_geometry_reply_t>(cookies.size);
+  const auto place = await<xcb_translate_coordinates_reply_t>(cookies.place);
+  const bool placed = size != nullptr && place != nullptr;
+  window.area = placed ? Area{place->dst_x, place->dst_y, size->width, size->height} : Area{};
 }
 
 }  // namespace
 
-bool hasXServer() { return x::connection() != nullptr; }
-
-bool takeInX() {
-  xcb_connection_t* const server = x::connection();
-  if (server == nullptr) {
-    sKnown.active = XCB_NONE;
-    return know({});
+bool takeInClients() {
+  xcb_connection_t* const server = connection();
+  std::vector<Window> windows;
+  if (server != nullptr) {
+    if (sChanges == changes().windows) return false;
+    sChanges = changes().windows;
+    windows = readClients(server);
   }
-  return sKnown.changes != x::changes().windows ? readEverything(server) : readChangingClasses(server);
+  if (windows == sClients) return false;
+  sClients = std::move(windows);
+  return true;
 }
 
-const std::vector<Client>& clients() { return sKnown.clients; }
+const std::vector<Window>& clients() { return sClients; }
 
-Window activeWindow() { return sKnown.active; }
+void look(std::span<Window> windows) {
+  xcb_connection_t* const server = connection();
+  if (server == nullptr) return;
+  const auto currentCookie = askProperty(root(), atom(NetCurrentDesktop));
+  std::vector<LookCookies> cookies;
+  cookies.reserve(windows.size());
+  for (const Window& window : windows) cookies.push_back(askLook(server, numberOf(window)));
+  const std::uint32_t current = Numbers(currentCookie).first(kEveryDesktop);
+  for (std::size_t i = 0; i < windows.size(); ++i) awaitLook(windows[i], cookies[i], current);
+}
 
-}  // namespace desktop
+}  // namespace linux::windows::x11

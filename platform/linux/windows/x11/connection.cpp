@@ -11,25 +11,29 @@
 #include <algorithm>
 #include <array>
 #include <cerrno>
-#include <chrono>
 #include <csignal>
 #include <optional>
 #include <string_view>
 
+#include "platform/base/deadline.h"
 #include "platform/base/file_descriptor.h"
 #include "platform/base/run_loop.h"
 #include "platform/linux/system/turn.h"
 #include "platform/linux/windows/x11/display.h"
 
-namespace desktop::x {
+namespace linux::windows::x11 {
 namespace {
 
+// In the order of Atom, one a line.
+// clang-format off
 constexpr std::array<const char*, kAtomCount> kAtomNames = {
-    "_NET_ACTIVE_WINDOW",   "_NET_CLIENT_LIST",         "_NET_CLIENT_LIST_STACKING",
-    "_NET_CURRENT_DESKTOP", "_NET_WM_DESKTOP",          "_NET_WM_PID",
-    "_NET_WM_STATE",        "_NET_WM_STATE_FULLSCREEN", "_NET_WM_STATE_HIDDEN",
-    "_GTK_APPLICATION_ID",
+    "_NET_ACTIVE_WINDOW",   "_NET_CLIENT_LIST",        "_NET_CLIENT_LIST_STACKING",
+    "_NET_CURRENT_DESKTOP", "_NET_WM_DESKTOP",         "_NET_WM_NAME",
+    "_NET_WM_PID",          "_NET_WM_STATE",           "_NET_WM_STATE_FULLSCREEN",
+    "_NET_WM_STATE_HIDDEN", "_GTK_APPLICATION_ID",     "_GTK_APPLICATION_OBJECT_PATH",
+    "_GTK_UNIQUE_BUS_NAME", "_GTK_WINDOW_OBJECT_PATH",
 };
+// clang-format on
 
 /// Properties of the root window that tell of the windows.
 constexpr Atom kWatched[] = {NetActiveWindow, NetClientList, NetClientListStacking};
@@ -51,40 +55,20 @@ void loseConnection() {
 
 bool isHealthy() { return sConnection != nullptr && !sHangs && xcb_connection_has_error(sConnection) == 0; }
 
-int millisecondsUntil(std::chrono::steady_clock::time_point deadline) {
-  const auto left = std::chrono::ceil<std::chrono::milliseconds>(deadline - std::chrono::steady_clock::now());
-  return std::max(0, static_cast<int>(left.count()));
-}
-
-/// Whether something comes to read before the deadline.
-bool waitFor(int descriptor, std::chrono::steady_clock::time_point deadline) {
-  pollfd polled{descriptor, POLLIN, 0};
-  int result = 0;
-  do {
-    result = poll(&polled, 1, millisecondsUntil(deadline));
-  } while (result < 0 && errno == EINTR);
-  return result > 0;
-}
-
-std::chrono::steady_clock::time_point deadline() {
-  return std::chrono::steady_clock::now() + std::chrono::microseconds(kQueryLimit);
-}
-
 /// Whether a server lets us in before long. xcb would wait for its greeting for ever, so a child tries first.
 bool serverAnswers() {
-  int ends[2];
-  if (pipe2(ends, O_CLOEXEC) != 0) return false;
-  base::FileDescriptor reading(ends[0]);
-  base::FileDescriptor writing(ends[1]);
+  auto [reading, writing] = base::makePipe();
+  if (!reading) return false;
   const pid_t child = fork();
   if (child < 0) return false;
   if (child == 0) {
-    if (xcb_connection_has_error(xcb_connect(nullptr, nullptr)) == 0) (void)!write(ends[1], "", 1);
+    if (xcb_connection_has_error(xcb_connect(nullptr, nullptr)) == 0) (void)!write(writing.get(), "", 1);
     _exit(0);
   }
   writing = base::FileDescriptor();
   char byte = 0;
-  const bool answered = waitFor(reading.get(), deadline()) && read(reading.get(), &byte, 1) == 1;
+  const base::Deadline deadline(system::kQueryLimit);
+  const bool answered = base::waitFor(reading.get(), POLLIN, deadline) && read(reading.get(), &byte, 1) == 1;
   kill(child, SIGKILL);
   while (waitpid(child, nullptr, 0) < 0 && errno == EINTR) continue;
   return answered;
@@ -161,6 +145,8 @@ xcb_connection_t* connection() {
   return sConnection;
 }
 
+void disconnect() { loseConnection(); }
+
 const Changes& changes() { return sChanges; }
 
 xcb_window_t root() { return sRoot; }
@@ -180,7 +166,7 @@ bool hasResource() {
 void* awaitReply(unsigned sequence) {
   if (!isHealthy()) return nullptr;
   xcb_flush(sConnection);
-  const auto end = deadline();
+  const base::Deadline deadline(system::kQueryLimit);
   while (true) {
     void* reply = nullptr;
     xcb_generic_error_t* error = nullptr;
@@ -188,7 +174,7 @@ void* awaitReply(unsigned sequence) {
       std::free(error);
       return reply;
     }
-    if (waitFor(xcb_get_file_descriptor(sConnection), end)) continue;
+    if (base::waitFor(xcb_get_file_descriptor(sConnection), POLLIN, deadline)) continue;
     sHangs = true;
     sTried = base::turn();
     return nullptr;
@@ -214,4 +200,4 @@ std::string awaitText(xcb_get_property_cookie_t cookie) {
   return {static_cast<const char*>(xcb_get_property_value(reply.get())), reply->value_len};
 }
 
-}  // namespace desktop::x
+}  // namespace linux::windows::x11

@@ -14,7 +14,7 @@
 #include <span>
 #include <string>
 
-namespace desktop::x {
+namespace linux::windows::x11 {
 
 /// The atoms in use, interned with each connection.
 enum Atom : std::uint8_t {
@@ -23,11 +23,15 @@ enum Atom : std::uint8_t {
   NetClientListStacking,
   NetCurrentDesktop,
   NetWmDesktop,
+  NetWmName,
   NetWmPid,
   NetWmState,
   NetWmStateFullscreen,
   NetWmStateHidden,
   GtkApplicationId,
+  GtkApplicationObjectPath,
+  GtkUniqueBusName,
+  GtkWindowObjectPath,
   kAtomCount,
 };
 
@@ -42,6 +46,9 @@ struct Changes {
   unsigned keyboard = 0;
 };
 const Changes& changes();
+
+/// Closes it. Questions that come later open it again.
+void disconnect();
 
 xcb_window_t root();
 xcb_atom_t atom(Atom name);
@@ -90,4 +97,7 @@ class Numbers {
 /// A property of bytes as it stands, NULs and all.
 std::string awaitText(xcb_get_property_cookie_t cookie);
 
-}  // namespace desktop::x
+/// The bytes before the first NUL.
+inline std::string firstText(const std::string& bytes) { return bytes.substr(0, bytes.find('\0')); }
+
+}  // namespace linux::windows::x11

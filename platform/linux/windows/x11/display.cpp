@@ -6,7 +6,7 @@
 
 #include "platform/linux/system/bus.h"
 
-namespace desktop::x {
+namespace linux::windows::x11 {
 namespace {
 
 constexpr std::string_view kVariables[] = {"DISPLAY", "XAUTHORITY"};
@@ -28,9 +28,10 @@ bool take(std::string_view assignment) {
 }  // namespace
 
 bool takeDisplayOfSession() {
-  const Message answer = call({"org.freedesktop.systemd1", 0},
-                              {"/org/freedesktop/systemd1", "org.freedesktop.DBus.Properties", "Get"},
-                              kQueryLimit, "ss", "org.freedesktop.systemd1.Manager", "Environment");
+  const system::Message answer =
+      system::call({"org.freedesktop.systemd1", 0},
+                   {"/org/freedesktop/systemd1", "org.freedesktop.DBus.Properties", "Get"},
+                   system::kQueryLimit, "ss", "org.freedesktop.systemd1.Manager", "Environment");
   if (answer == nullptr || sd_bus_message_enter_container(answer.get(), 'v', "as") <= 0 ||
       sd_bus_message_enter_container(answer.get(), 'a', "s") <= 0) {
     return false;
@@ -41,4 +42,4 @@ bool takeDisplayOfSession() {
   return changed;
 }
 
-}  // namespace desktop::x
+}  // namespace linux::windows::x11

@@ -1,11 +1,15 @@
-#include "platform/linux/roles/script_world.h"
+#include "platform/linux/roles/world.h"
 
 #include "platform/linux/roles/additions.h"
-#include "platform/linux/roles/role_application.h"
-#include "platform/scripting/script.h"
+#include "platform/linux/roles/disc_player.h"
+#include "platform/linux/roles/jukebox.h"
+#include "platform/linux/roles/keyhouse.h"
+#include "platform/linux/roles/movies.h"
+#include "platform/linux/roles/photo_library.h"
+#include "platform/linux/roles/presentation.h"
 #include "platform/tarnscript/text.h"
 
-namespace desktop {
+namespace linux::roles {
 
 namespace {
 
@@ -28,7 +32,7 @@ constexpr Row kApplications[] = {
 class World final : public tarnscript::World {
  public:
   tarnscript::Application* find(std::string_view identifierOrName) override;
-  tarnscript::Application& additions() override { return desktop::additions(); }
+  tarnscript::Application& additions() override { return roles::additions(); }
 };
 
 tarnscript::Application* World::find(std::string_view identifierOrName) {
@@ -46,9 +50,9 @@ tarnscript::Application* World::find(std::string_view identifierOrName) {
 
 }  // namespace
 
-void letScriptsFindRoles() {
-  static World world;
-  scripting::setHooks({&world, nullptr, nullptr});
+tarnscript::World& world() {
+  static World instance;
+  return instance;
 }
 
-}  // namespace desktop
+}  // namespace linux::roles

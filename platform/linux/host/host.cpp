@@ -1,0 +1,26 @@
+#include "platform/linux/host/host.h"
+
+#include "platform/base/port_names.h"
+#include "platform/linux/roles/world.h"
+#include "platform/linux/sound/sound.h"
+#include "platform/linux/system/bus.h"
+#include "platform/linux/windows/windows.h"
+#include "platform/scripting/script.h"
+
+namespace linux::host {
+
+void init(std::initializer_list<const windows::Backend*> backends) {
+  base::bootstrapIsThere = [] { return system::bus() != nullptr; };
+  windows::init(backends);
+  scripting::setHooks({.world = &roles::world(), .started = nullptr, .ended = nullptr});
+}
+
+void finish() {
+  scripting::setHooks({});
+  sound::finish();
+  windows::finish();
+  system::closeBus();
+  base::bootstrapIsThere = nullptr;
+}
+
+}  // namespace linux::host

@@ -1,0 +1,17 @@
+// The real desktop as a host, put together and taken apart.
+#pragma once
+
+#include <initializer_list>
+
+#include "platform/linux/windows/backend.h"
+
+namespace linux::host {
+
+/// Puts the host together: what a start needs, the windows by these back ends, what scripts can name.
+/// Connections are made when they are first needed.
+void init(std::initializer_list<const windows::Backend*> backends);
+
+/// Closes what was opened since. What was sent gets through.
+void finish();
+
+}  // namespace linux::host

@@ -1,0 +1,51 @@
+// What a window system has to offer: a table of functions that each back end fills in.
+#pragma once
+
+#include <cstdint>
+#include <span>
+#include <vector>
+
+#include "platform/linux/windows/window.h"
+
+namespace linux::windows {
+
+/// How far a key can be sent.
+enum class Reach : std::uint8_t {
+  Nobody,
+  FocusedWindow,
+  AnyWindow,
+};
+
+/// Modifiers held while a key goes down or up.
+enum Modifier : std::uint8_t { kNoModifier = 0, kShift = 1, kControl = 2, kAlt = 4 };
+using Modifiers = std::uint8_t;
+
+/// A back end. None of its functions waits longer than a question may take; a window that has gone is as good
+/// as one that does nothing. What a back end lacks it takes from kNone.
+struct Backend {
+  /// Makes the connection, where there is none, at most once a turn of the run loop. Whether there is one.
+  bool (*open)();
+  /// Closes the connection for good.
+  void (*close)();
+  /// Takes in what the window system has sent. True when the list has changed since the last call.
+  bool (*takeIn)();
+  /// The windows that the person has open, topmost first. Valid until takeIn.
+  const std::vector<Window>& (*list)();
+  /// Brings up to date how windows of list() look, and their class.
+  void (*look)(std::span<Window> windows);
+  /// Whether it can tell which window is active.
+  bool (*knowsFront)();
+  Reach (*reach)();
+  /// Asks for the window to come to the front.
+  void (*activate)(std::uint64_t window);
+  /// Sends a press or release of a key, an X keysym (which is what xkb names them), to a window within reach.
+  /// False when the keyboard has no such key or the window is gone.
+  bool (*sendKey)(std::uint64_t window, std::uint32_t keysym, bool down, Modifiers modifiers);
+  /// In the pixels in which it tells the areas of windows.
+  std::vector<Output> (*outputs)();
+};
+
+/// Does nothing, completely: it is never open, knows no window and takes no key.
+extern const Backend kNone;
+
+}  // namespace linux::windows

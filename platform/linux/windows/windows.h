@@ -1,0 +1,53 @@
+// The windows of the desktop, whichever window systems there are.
+//
+// The back ends that open are asked, and what they say is merged: over XWayland two of them know a part each,
+// and some windows both. Without any, every question is answered with nothing.
+#pragma once
+
+#include <cstdint>
+#include <initializer_list>
+#include <span>
+#include <vector>
+
+#include "platform/linux/windows/backend.h"
+
+namespace linux::windows {
+
+/// The back ends to be asked from here on; where two know the same, the earlier one is believed.
+void init(std::initializer_list<const Backend*> backends);
+/// Closes them.
+void finish();
+
+/// Whether any back end is open.
+bool isOpen();
+
+/// Takes in what the window systems have sent. True when windows came or went, changed their order, whose
+/// they are or which is active since the last call.
+bool takeIn();
+
+/// All windows, topmost first. Valid until takeIn, as what front lends.
+const std::vector<Window>& list();
+
+/// The active window; null where there is none, and where nobody can tell.
+const Window* front();
+
+/// These windows as they look now, those that have gone left out.
+std::vector<Window> look(std::span<const ID> windows);
+
+/// Whether a key can be sent to this window now.
+bool takesKeys(const Window& window);
+
+/// Asks for the window to come to the front.
+void activate(ID window);
+
+/// Sends a press or release of a key, an X keysym, to one window and to nothing else. False when it cannot be
+/// reached, is gone, or the keyboard has no such key.
+bool sendKey(ID window, std::uint32_t keysym, bool down, Modifiers modifiers);
+
+/// The active outputs of all back ends.
+std::vector<Output> outputs();
+
+/// Whether a shown full-screen window covers most of this output.
+bool isCaptured(std::uint32_t output);
+
+}  // namespace linux::windows
