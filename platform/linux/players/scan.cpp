@@ -1,6 +1,7 @@
 #include "platform/linux/players/scan.h"
 
 #include <algorithm>
+#include <chrono>
 #include <cmath>
 #include <list>
 #include <utility>
@@ -14,8 +15,8 @@ namespace {
 
 /// How often a scan seeks, in seconds.
 constexpr double kInterval = 0.25;
-/// The longest step that a seek makes up for, when the machine slept or the loop was held up, in seconds.
-constexpr double kLongestStep = 2;
+/// The longest step that a seek makes up for, when the machine slept or the loop was held up.
+constexpr std::chrono::seconds kLongestStep{2};
 /// A scan forward ends so far before the end, in microseconds: what plays then ends by itself.
 constexpr std::int64_t kBeforeEnd = 1'000'000;
 
@@ -34,8 +35,8 @@ struct Scan {
   std::string trackID;
   std::string url;
   std::int64_t position;
-  /// When it stood there, on the clock of HostAbsoluteTime.
-  double when;
+  /// When it stood there.
+  base::Clock::time_point when;
   HostTimerRef timer;
 };
 
@@ -64,8 +65,10 @@ bool step(Scan& scan) {
     scan.url = state.url;
     scan.position = state.position;
   }
-  const double now = HostAbsoluteTime();
-  scan.position += static_cast<std::int64_t>(scan.rate * std::min(now - scan.when, kLongestStep) * 1e6);
+  const auto now = base::Clock::now();
+  const std::chrono::duration<double, std::micro> passed =
+      std::min<base::Clock::duration>(now - scan.when, kLongestStep);
+  scan.position += static_cast<std::int64_t>(scan.rate * passed.count());
   scan.when = now;
   const bool atBeginning = scan.position <= 0;
   const bool atEnd = state.length && scan.position >= *state.length - kBeforeEnd;
@@ -100,11 +103,11 @@ void scan(Player& player, double rate) {
   if (!state.canSeek || state.status == PlaybackStatus::Stopped) {
     throw tarnscript::Refusal{"there is nothing to scan through"};
   }
-  const double now = HostAbsoluteTime();
-  const HostTimerRef timer = HostCreateRepeatingTimer(now + kInterval, kInterval, tick, nullptr);
+  const HostTimerRef timer =
+      HostCreateRepeatingTimer(HostAbsoluteTime() + kInterval, kInterval, tick, nullptr);
   if (!timer) throw tarnscript::Refusal{"there is no timer"};
-  sScans.push_back(
-      {player.callee.name, rate, state.status, false, state.trackID, state.url, state.position, now, timer});
+  sScans.push_back({player.callee.name, rate, state.status, false, state.trackID, state.url, state.position,
+                    base::Clock::now(), timer});
   HostRunLoopAddTimer(HostRunLoopCurrent(), timer, HostRunLoopMode::Default);
 }
 

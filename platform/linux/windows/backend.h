@@ -21,7 +21,7 @@ enum Modifier : std::uint8_t { kNoModifier = 0, kShift = 1, kControl = 2, kAlt =
 using Modifiers = std::uint8_t;
 
 /// A back end. None of its functions waits longer than a question may take; a window that has gone is as good
-/// as one that does nothing. What a back end lacks it takes from kNone.
+/// as one that does nothing. What a back end lacks it takes from kNone (none.h).
 struct Backend {
   /// Makes the connection, where there is none, at most once a turn of the run loop. Whether there is one.
   bool (*open)();
@@ -44,8 +44,5 @@ struct Backend {
   /// In the pixels in which it tells the areas of windows.
   std::vector<Output> (*outputs)();
 };
-
-/// Does nothing, completely: it is never open, knows no window and takes no key.
-extern const Backend kNone;
 
 }  // namespace linux::windows

@@ -8,7 +8,7 @@ namespace linux::windows {
 
 namespace {
 
-// clang-format off: a table, to be read as one.
+// clang-format off
 struct NamedKey {
   const char* name;
   std::uint32_t keysym;

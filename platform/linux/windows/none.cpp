@@ -1,6 +1,4 @@
-// The back end of a desktop that says nothing.
-
-#include "platform/linux/windows/backend.h"
+#include "platform/linux/windows/none.h"
 
 namespace linux::windows {
 

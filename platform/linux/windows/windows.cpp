@@ -173,11 +173,6 @@ std::vector<Window> look(std::span<const ID> windows) {
   return looked;
 }
 
-bool takesKeys(const Window& window) {
-  const auto index = indexOf(window.id);
-  return index && reachable(sWindows[*index], sIDs[*index]);
-}
-
 void activate(ID window) {
   if (window) window.backend->activate(window.number);
 }

@@ -34,9 +34,6 @@ const Window* front();
 /// These windows as they look now, those that have gone left out.
 std::vector<Window> look(std::span<const ID> windows);
 
-/// Whether a key can be sent to this window now.
-bool takesKeys(const Window& window);
-
 /// Asks for the window to come to the front.
 void activate(ID window);
 

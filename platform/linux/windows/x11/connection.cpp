@@ -27,11 +27,20 @@ namespace {
 // In the order of Atom, one a line.
 // clang-format off
 constexpr std::array<const char*, kAtomCount> kAtomNames = {
-    "_NET_ACTIVE_WINDOW",   "_NET_CLIENT_LIST",        "_NET_CLIENT_LIST_STACKING",
-    "_NET_CURRENT_DESKTOP", "_NET_WM_DESKTOP",         "_NET_WM_NAME",
-    "_NET_WM_PID",          "_NET_WM_STATE",           "_NET_WM_STATE_FULLSCREEN",
-    "_NET_WM_STATE_HIDDEN", "_GTK_APPLICATION_ID",     "_GTK_APPLICATION_OBJECT_PATH",
-    "_GTK_UNIQUE_BUS_NAME", "_GTK_WINDOW_OBJECT_PATH",
+    "_NET_ACTIVE_WINDOW",
+    "_NET_CLIENT_LIST",
+    "_NET_CLIENT_LIST_STACKING",
+    "_NET_CURRENT_DESKTOP",
+    "_NET_WM_DESKTOP",
+    "_NET_WM_NAME",
+    "_NET_WM_PID",
+    "_NET_WM_STATE",
+    "_NET_WM_STATE_FULLSCREEN",
+    "_NET_WM_STATE_HIDDEN",
+    "_GTK_APPLICATION_ID",
+    "_GTK_APPLICATION_OBJECT_PATH",
+    "_GTK_UNIQUE_BUS_NAME",
+    "_GTK_WINDOW_OBJECT_PATH",
 };
 // clang-format on
 
