@@ -87,6 +87,7 @@ constexpr Program kPrograms[] = {
      .actions = {{
          {slidewell::kStart, Means::Action, "win.presentation"},
      }}},
+    {.role = Role::Presentation, .name = "Atril", .entry = "atril", .windowClass = "atril"},
     {.role = Role::Presentation, .name = "Okular", .entry = "org.kde.okular", .windowClass = "okular", .show = ShowStyle::OwnWindow,
      .actions = {{
          {slidewell::kStart, Means::Method, "org.kde.okular-% /okular org.kde.okular slotTogglePresentation"},
