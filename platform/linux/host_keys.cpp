@@ -60,7 +60,7 @@ void HostPostEventToProcess(const HostProcessSerialNumber& process, HostKeyEvent
   const desktop::Instance* const instance = desktop::findInstance(process);
   if (key == nullptr || instance == nullptr) return;
   EventSource& source = *key->source;
-  if (key->virtualKey == desktop::kVirtualShift) {
+  if (key->virtualKey == HostVirtualKey::Shift) {
     source.shiftIsDown = key->down;
   } else if (key->down) {
     source.pressedIn = desktop::pressKey(*instance, key->virtualKey, source.modifiers());

@@ -1,5 +1,7 @@
 #include "platform/linux/own_words.h"
 
+#include "platform/host.h"
+
 namespace desktop {
 
 namespace {
@@ -11,10 +13,10 @@ struct KeyWord {
 };
 
 constexpr KeyWord kKeyWords[] = {
-    {words::kShiftS, 1, true},
-    {words::kReturn, 36, false},
-    {words::kSpace, 49, false},
-    {words::kEscape, 53, false},
+    {words::kShiftS, HostVirtualKey::S, true},
+    {words::kReturn, HostVirtualKey::Return, false},
+    {words::kSpace, HostVirtualKey::Space, false},
+    {words::kEscape, HostVirtualKey::Escape, false},
 };
 
 struct Name {
