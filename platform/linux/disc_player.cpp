@@ -24,15 +24,6 @@ using tarnscript::Value;
 /// The volume in the words of scripts.
 constexpr double kFullVolume = 255;
 
-struct ScanRate {
-  words::Code code;
-  double rate;
-};
-
-constexpr ScanRate kScanRates[] = {
-    {words::kX1, 1}, {words::kX2, 2}, {words::kX4, 4}, {words::kX8, 8}, {words::kX16, 16}, {words::kX32, 32},
-};
-
 /// How a chapter is gone to.
 enum class Way : std::uint8_t {
   Channel,   ///< by its number, over VLC's channel
@@ -152,9 +143,7 @@ void DiscPlayer::goToChapter(int wanted) const {
 
 void DiscPlayer::scanAt(double direction) const {
   if (showsMenu(stateOf(player()))) return;
-  const auto* const row = std::find_if(std::begin(kScanRates), std::end(kScanRates),
-                                       [&](const ScanRate& scan) { return scan.code == scanRate_; });
-  playAtRate(instance(), direction * row->rate);
+  playAtRate(instance(), direction * *words::rateOf(scanRate_));
 }
 
 void DiscPlayer::goToMenu(const tarnscript::Event& event) {
@@ -231,9 +220,7 @@ void DiscPlayer::set(const ObjectRef& object, tarnscript::Code property, const V
   switch (property) {
     case words::kScanRate: {
       const words::Code wanted = tarnscript::toTypeCode(value);
-      const bool known = std::any_of(std::begin(kScanRates), std::end(kScanRates),
-                                     [&](const ScanRate& scan) { return scan.code == wanted; });
-      if (known) scanRate_ = wanted;
+      if (words::rateOf(wanted)) scanRate_ = wanted;
       return;
     }
     case words::kChapter:
