@@ -1,6 +1,5 @@
 #include "adapters/lumbra.h"
 
-#include "adapters/virtual_keys.h"
 #include "daemon/kvd.h"
 #include "routing/display.h"
 #include "routing/keys.h"
@@ -18,13 +17,13 @@ bool Nothing(std::int32_t) { return true; }
 
 bool StartOrPause(std::int32_t) {
   if (AnyDisplayIsCaptured()) {
-    Post(VirtualKey::Space);
+    Post(HostVirtualKey::Space);
     return true;
   }
   SilenceAllBut(App::Lumb);
-  Post(VirtualKey::S, true);
+  Post(HostVirtualKey::S, true);
   HostSleepMicroseconds(kBeforeReturn);
-  Post(VirtualKey::Return);
+  Post(HostVirtualKey::Return);
   return true;
 }
 
@@ -57,14 +56,14 @@ constexpr Row kButtons[] = {
     {Key::Undefined, Nothing},
     {Key::SystemAppMenu, Nothing},
     {Key::SystemMenuSelect, StartOrPause},
-    {Key::SystemMenuRight, Step<VirtualKey::RightArrow>},
-    {Key::SystemMenuLeft, Step<VirtualKey::LeftArrow>},
-    {Key::SystemMenuUp, Move<VirtualKey::UpArrow>},
-    {Key::SystemMenuDown, Move<VirtualKey::DownArrow>},
+    {Key::SystemMenuRight, Step<HostVirtualKey::RightArrow>},
+    {Key::SystemMenuLeft, Step<HostVirtualKey::LeftArrow>},
+    {Key::SystemMenuUp, Move<HostVirtualKey::UpArrow>},
+    {Key::SystemMenuDown, Move<HostVirtualKey::DownArrow>},
     {Key::Menu, Exit},
     {Key::MenuPick, Nothing},
-    {Key::FastForward, Step<VirtualKey::RightArrow>},
-    {Key::Rewind, Step<VirtualKey::LeftArrow>},
+    {Key::FastForward, Step<HostVirtualKey::RightArrow>},
+    {Key::Rewind, Step<HostVirtualKey::LeftArrow>},
     {Key::Stop, Exit},
     {Key::PlayPause, StartOrPause},
 };
@@ -80,5 +79,5 @@ bool LumbraHandleHIDEvent(std::uint32_t usagePage, std::uint32_t usage, std::int
 }
 
 void LumbraCommand_ExitSlideShow() {
-  if (AnyDisplayIsCaptured()) Post(VirtualKey::Escape);
+  if (AnyDisplayIsCaptured()) Post(HostVirtualKey::Escape);
 }

@@ -1,7 +1,6 @@
 #include "adapters/snapvale.h"
 
 #include "adapters/snapvale_scripts.h"
-#include "adapters/virtual_keys.h"
 #include "daemon/kvd.h"
 #include "registry/bridge.h"
 #include "registry/registry.h"
@@ -28,7 +27,7 @@ bool Nothing(const Situation&) { return true; }
 
 bool Play(const Situation& situation) {
   if (AnyDisplayIsCaptured()) {
-    Post(VirtualKey::Space);
+    Post(HostVirtualKey::Space);
     return true;
   }
   SilenceAllBut(App::Snap);
@@ -43,11 +42,11 @@ bool Play(const Situation& situation) {
 bool Menu(const Situation& situation) {
   if (!situation.isModern()) {
     if (!AnyDisplayIsCaptured()) return Play(situation);
-    Post(VirtualKey::Return);
+    Post(HostVirtualKey::Return);
     return true;
   }
   if (AnyDisplayIsCaptured()) {
-    Post(VirtualKey::Escape);
+    Post(HostVirtualKey::Escape);
     return true;
   }
   SilenceAllBut(App::Snap);
@@ -68,10 +67,12 @@ bool Step(const Situation& situation, std::uint16_t arrow, const scripts::Genera
   return true;
 }
 
-bool Next(const Situation& situation) { return Step(situation, VirtualKey::RightArrow, scripts::kNextAlbum); }
+bool Next(const Situation& situation) {
+  return Step(situation, HostVirtualKey::RightArrow, scripts::kNextAlbum);
+}
 
 bool Previous(const Situation& situation) {
-  return Step(situation, VirtualKey::LeftArrow, scripts::kPreviousAlbum);
+  return Step(situation, HostVirtualKey::LeftArrow, scripts::kPreviousAlbum);
 }
 
 bool AppMenu(const Situation& situation) {

@@ -162,6 +162,20 @@ struct HostProcessSerialNumber {
   friend constexpr bool operator==(const HostProcessSerialNumber&, const HostProcessSerialNumber&) = default;
 };
 
+/// Virtual key codes: the keys that the daemon presses and the few more that hosts must tell apart.
+namespace HostVirtualKey {
+inline constexpr std::uint16_t S = 1;
+inline constexpr std::uint16_t Return = 36;
+inline constexpr std::uint16_t Tab = 48;
+inline constexpr std::uint16_t Space = 49;
+inline constexpr std::uint16_t Escape = 53;
+inline constexpr std::uint16_t Shift = 56;
+inline constexpr std::uint16_t LeftArrow = 123;
+inline constexpr std::uint16_t RightArrow = 124;
+inline constexpr std::uint16_t DownArrow = 125;
+inline constexpr std::uint16_t UpArrow = 126;
+}  // namespace HostVirtualKey
+
 /// The process's connection to the window server, 0 on failure.
 HostConnectionID HostConnectWindowServer();
 /// How many seconds the user's own input is held back after a synthetic event. 0 on success.

@@ -4,7 +4,6 @@
 
 namespace {
 
-constexpr std::uint16_t kShiftKey = 56;
 constexpr std::uint32_t kFindRunningProcess = 1;
 
 constexpr std::uint32_t kHeldTime = 50'000;   // microseconds
@@ -32,8 +31,8 @@ void PostKeyEvent(HostStringRef bundleIdentifier, std::uint16_t keyCode, bool wi
   if (HostFindProcessByBundleIdentifier(bundleIdentifier, kFindRunningProcess, &process, &found) != 0) return;
   if (found == 0) return;
 
-  if (withShift) Post(process, kShiftKey, true, kPauseTime);
+  if (withShift) Post(process, HostVirtualKey::Shift, true, kPauseTime);
   Post(process, keyCode, true, kHeldTime);
   Post(process, keyCode, false, kPauseTime);
-  if (withShift) Post(process, kShiftKey, false, kPauseTime);
+  if (withShift) Post(process, HostVirtualKey::Shift, false, kPauseTime);
 }

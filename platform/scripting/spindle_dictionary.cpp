@@ -1,5 +1,8 @@
 #include "platform/scripting/spindle_dictionary.h"
 
+#include <algorithm>
+#include <iterator>
+
 namespace scripting::spindle {
 
 namespace {
@@ -54,9 +57,24 @@ constexpr tarnscript::ConstantTerm kConstants[] = {
     {"no menu", kNoMenu},
 };
 
+struct ScanRate {
+  Code code;
+  double rate;
+};
+
+constexpr ScanRate kScanRates[] = {
+    {kX1, 1}, {kX2, 2}, {kX4, 4}, {kX8, 8}, {kX16, 16}, {kX32, 32},
+};
+
 constexpr tarnscript::Dictionary kDictionary{{}, kProperties, kCommands, {}, kConstants};
 
 }  // namespace
+
+std::optional<double> rateOf(Code scanRate) {
+  const auto* const row = std::ranges::find(kScanRates, scanRate, &ScanRate::code);
+  if (row == std::end(kScanRates)) return std::nullopt;
+  return row->rate;
+}
 
 const tarnscript::Dictionary& dictionary() { return kDictionary; }
 

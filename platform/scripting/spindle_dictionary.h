@@ -1,6 +1,8 @@
 // The words of the disc player.
 #pragma once
 
+#include <optional>
+
 #include "platform/tarnscript/tarnscript.h"
 
 namespace scripting::spindle {
@@ -27,7 +29,7 @@ inline constexpr Code kPaused = code("espa");
 inline constexpr Code kStopped = code("esps");
 inline constexpr Code kIdle = code("esid");
 
-/// Scan rates: x1, x2, x4, x8, x16, x32.
+/// Scan rates; rateOf() tells how fast they are.
 inline constexpr Code kX1 = code("xs01");
 inline constexpr Code kX2 = code("xs02");
 inline constexpr Code kX4 = code("xs04");
@@ -51,6 +53,9 @@ inline constexpr Code kPressDown = code("cKDn");
 inline constexpr Code kPressLeft = code("cKLf");
 inline constexpr Code kPressRight = code("cKRt");
 inline constexpr Code kPressEnter = code("cKEn");
+
+/// How many times as fast as the film runs a scan rate is, 1 to 32; nothing for a code that is none.
+std::optional<double> rateOf(Code scanRate);
 
 const tarnscript::Dictionary& dictionary();
 

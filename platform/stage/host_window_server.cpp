@@ -8,7 +8,6 @@
 #include "platform/host.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/journal.h"
-#include "platform/stage/virtual_keys.h"
 
 namespace {
 
@@ -80,7 +79,7 @@ void HostPostEventToProcess(const HostProcessSerialNumber& serialNumber, HostKey
   record(Entry::Key, "key " + std::to_string(key->virtualKey) +
                          (key->down ? " pressed in " : " released in ") + process->application->name);
   static bool sShiftIsDown = false;
-  if (key->virtualKey == stage::keys::kShift) {
+  if (key->virtualKey == HostVirtualKey::Shift) {
     sShiftIsDown = key->down;
   } else if (key->down) {
     process->application->receiveKey(key->virtualKey, sShiftIsDown);

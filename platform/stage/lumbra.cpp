@@ -2,8 +2,8 @@
 
 #include <algorithm>
 
+#include "platform/host.h"
 #include "platform/stage/desktop.h"
-#include "platform/stage/virtual_keys.h"
 
 namespace stage {
 
@@ -20,35 +20,35 @@ std::string Lumbra::describe() const {
 
 void Lumbra::receiveKey(std::uint16_t virtualKey, bool withShift) {
   if (slideshow_.running) {
-    if (virtualKey == keys::kEscape) {
+    if (virtualKey == HostVirtualKey::Escape) {
       ended();
       giveDisplayBack(*this);
     } else if (!slideshow_.receiveKey(virtualKey)) {
       return;
     }
   } else if (asks_) {
-    if (virtualKey != keys::kReturn && virtualKey != keys::kEscape) return;
+    if (virtualKey != HostVirtualKey::Return && virtualKey != HostVirtualKey::Escape) return;
     asks_ = false;
-    if (virtualKey == keys::kReturn) {
+    if (virtualKey == HostVirtualKey::Return) {
       slideshow_.start();
       takeDisplay(*this);
     }
   } else {
     switch (virtualKey) {
-      case keys::kS:
+      case HostVirtualKey::S:
         if (!withShift) return;
         asks_ = true;
         break;
-      case keys::kUpArrow:
+      case HostVirtualKey::UpArrow:
         row_ = std::max(row_ - 1, 1);
         break;
-      case keys::kDownArrow:
+      case HostVirtualKey::DownArrow:
         ++row_;
         break;
-      case keys::kLeftArrow:
+      case HostVirtualKey::LeftArrow:
         column_ = std::max(column_ - 1, 1);
         break;
-      case keys::kRightArrow:
+      case HostVirtualKey::RightArrow:
         ++column_;
         break;
       default:

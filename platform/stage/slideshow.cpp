@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "platform/stage/virtual_keys.h"
+#include "platform/host.h"
 
 namespace stage {
 
@@ -15,13 +15,13 @@ constexpr int kPhotoCount = 40;
 bool Slideshow::receiveKey(std::uint16_t virtualKey) {
   if (!running) return false;
   switch (virtualKey) {
-    case keys::kSpace:
+    case HostVirtualKey::Space:
       paused = !paused;
       return true;
-    case keys::kRightArrow:
+    case HostVirtualKey::RightArrow:
       photo = std::min(photo + 1, kPhotoCount);
       return true;
-    case keys::kLeftArrow:
+    case HostVirtualKey::LeftArrow:
       photo = std::max(photo - 1, 1);
       return true;
     default:

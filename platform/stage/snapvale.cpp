@@ -4,9 +4,9 @@
 #include <cstdlib>
 #include <iterator>
 
+#include "platform/host.h"
 #include "platform/scripting/snapvale_dictionary.h"
 #include "platform/stage/desktop.h"
-#include "platform/stage/virtual_keys.h"
 
 namespace stage {
 
@@ -74,13 +74,13 @@ void Snapvale::stopSlideshow() {
 
 void Snapvale::receiveKey(std::uint16_t virtualKey, bool) {
   switch (virtualKey) {
-    case keys::kReturn:
-    case keys::kEscape:
+    case HostVirtualKey::Return:
+    case HostVirtualKey::Escape:
       return stopSlideshow();
-    case keys::kTab:
+    case HostVirtualKey::Tab:
       sourceListHasFocus_ = !sourceListHasFocus_;
       return;
-    case keys::kUpArrow:
+    case HostVirtualKey::UpArrow:
       return selectAbove();
     default:
       if (slideshow_.receiveKey(virtualKey)) changed(describe());

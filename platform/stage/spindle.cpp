@@ -22,21 +22,6 @@ constexpr const char* kMenuItems[] = {"Play the film", "Chapter 4", "Subtitles"}
 constexpr int kMenuItemCount = std::size(kMenuItems);
 constexpr int kMenuChapter = 4;
 
-struct ScanRate {
-  words::Code code;
-  double rate;
-};
-
-constexpr ScanRate kScanRates[] = {
-    {words::kX1, 1}, {words::kX2, 2}, {words::kX4, 4}, {words::kX8, 8}, {words::kX16, 16}, {words::kX32, 32},
-};
-
-const ScanRate* findScanRate(words::Code code) {
-  const auto* const found = std::find_if(std::begin(kScanRates), std::end(kScanRates),
-                                         [&](const ScanRate& row) { return row.code == code; });
-  return found != std::end(kScanRates) ? found : nullptr;
-}
-
 /// Where a chapter, counted from 1, begins; one past the last gives the film's end.
 Nanoseconds startOf(int chapter) {
   Nanoseconds start = 0;
@@ -181,8 +166,7 @@ void Spindle::write(const tarnscript::ObjectRef& object, tarnscript::Code proper
   };
   switch (property) {
     case words::kScanRate:
-      if (findScanRate(tarnscript::toTypeCode(value)) == nullptr)
-        throw tarnscript::Refusal{"there is no such rate"};
+      if (!words::rateOf(tarnscript::toTypeCode(value))) throw tarnscript::Refusal{"there is no such rate"};
       scanRate_ = tarnscript::toTypeCode(value);
       break;
     case words::kChapter: {
@@ -218,7 +202,7 @@ void Spindle::write(const tarnscript::ObjectRef& object, tarnscript::Code proper
 
 Value Spindle::obey(const tarnscript::Event& event) {
   if (!hasDisc_) throw tarnscript::Refusal{"there is no disc"};
-  const double scanRate = findScanRate(scanRate_)->rate;
+  const double scanRate = *words::rateOf(scanRate_);
   const bool canScan = state_ == State::Playing || state_ == State::Paused;
   switch (event.command) {
     case words::kPlayDVD:

@@ -64,7 +64,7 @@ void HostPostEventToProcess(const HostProcessSerialNumber& process, HostKeyEvent
   const programs::Instance* const instance = programs::findInstance(process);
   if (key == nullptr || instance == nullptr) return;
   EventSource& source = *key->source;
-  if (key->virtualKey == windows::kVirtualShift) {
+  if (key->virtualKey == HostVirtualKey::Shift) {
     source.shiftIsDown = key->down;
   } else if (key->down) {
     source.pressedIn = roles::pressKey(roles::Performer(*instance), key->virtualKey, source.modifiers());

@@ -1,5 +1,7 @@
 #include "platform/linux/programs/own_words.h"
 
+#include "platform/host.h"
+
 namespace linux::programs::words {
 
 namespace {
@@ -11,10 +13,10 @@ struct KeyWord {
 };
 
 constexpr KeyWord kKeyWords[] = {
-    {kShiftS, 1, true},
-    {kReturn, 36, false},
-    {kSpace, 49, false},
-    {kEscape, 53, false},
+    {kShiftS, HostVirtualKey::S, true},
+    {kReturn, HostVirtualKey::Return, false},
+    {kSpace, HostVirtualKey::Space, false},
+    {kEscape, HostVirtualKey::Escape, false},
 };
 
 }  // namespace

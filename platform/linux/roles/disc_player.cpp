@@ -29,17 +29,6 @@ using tarnscript::Value;
 /// The volume in the words of scripts.
 constexpr double kFullVolume = 255;
 
-// TEMPORARY
-std::optional<double> rateOf(words::Code code) {
-  if (code == words::kX1) return 1;
-  if (code == words::kX2) return 2;
-  if (code == words::kX4) return 4;
-  if (code == words::kX8) return 8;
-  if (code == words::kX16) return 16;
-  if (code == words::kX32) return 32;
-  return std::nullopt;
-}
-
 /// How a chapter is gone to.
 enum class Way : std::uint8_t {
   Channel,   ///< by its number, over the program's channel
@@ -199,7 +188,7 @@ class DiscPlayer final : public RoleApplication {
 
 void DiscPlayer::scanAt(const Performer& performer, double direction) const {
   if (showsMenu(performer, players::stateOf(performer.player()))) return;
-  playAtRate(performer, direction * rateOf(scanRate_).value_or(1));
+  playAtRate(performer, direction * *words::rateOf(scanRate_));
 }
 
 void DiscPlayer::goToMenu(const Performer& performer) {
@@ -259,7 +248,7 @@ void DiscPlayer::setBy(const Performer& performer, const ObjectRef& object, tarn
   switch (property) {
     case words::kScanRate: {
       const words::Code wanted = tarnscript::toTypeCode(value);
-      if (rateOf(wanted)) scanRate_ = wanted;
+      if (words::rateOf(wanted)) scanRate_ = wanted;
       return;
     }
     case words::kChapter:

@@ -19,8 +19,6 @@ using tarnscript::ObjectRef;
 using tarnscript::Refusal;
 using tarnscript::Value;
 
-constexpr std::uint16_t kVirtualEscape = 53;
-
 constexpr std::pair<tarnscript::Code, windows::Modifier> kModifiers[] = {
     {keyhouse::kShiftDown, windows::kShift},
     {keyhouse::kOptionDown, windows::kAlt},
@@ -74,7 +72,7 @@ class Keyhouse final : public tarnscript::Application {
   static void press(const Performer& receiver, std::uint16_t virtualKey, tarnscript::Code modifier) {
     if (modifier == keyhouse::kCommandDown) {
       // No keyboard here has that key: the one shortcut in use has rows of its own.
-      if (virtualKey != kVirtualEscape) throw Refusal{"there is no such key"};
+      if (virtualKey != HostVirtualKey::Escape) throw Refusal{"there is no such key"};
       return roles::perform(receiver, programs::words::kCommandEscape);
     }
     windows::Modifiers modifiers = windows::kNoModifier;

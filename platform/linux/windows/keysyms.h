@@ -15,9 +15,6 @@ struct KeyStroke {
   Modifiers modifiers = kNoModifier;
 };
 
-/// The virtual key code of Shift, which is a modifier and not a key of its own.
-inline constexpr std::uint16_t kVirtualShift = 56;
-
 /// The key with this virtual key code; 0 when it is not in the table.
 std::uint32_t keysymOf(std::uint16_t virtualKey);
 
