@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "platform/scripting/identity.h"
 #include "platform/tarnscript/text.h"
 
 namespace desktop {
@@ -14,13 +15,13 @@ struct RoleRow {
 };
 
 constexpr RoleRow kRoles[] = {
-    {Role::Jukebox, "com.tarn.Lyrabox"},
-    {Role::DiscPlayer, "com.tarn.Spindle"},
-    {Role::ClassicMovies, "com.tarn.vistremeplayer"},
-    {Role::ModernMovies, "com.tarn.VistremePlayerX"},
-    {Role::Presentation, "com.tarn.Officra.Slidewell"},
-    {Role::PhotoLibrary, "com.tarn.Snapvale"},
-    {Role::ProfessionalPhotos, "com.tarn.Lumbra"},
+    {Role::Jukebox, scripting::kLyrabox.identifier},
+    {Role::DiscPlayer, scripting::kSpindle.identifier},
+    {Role::ClassicMovies, scripting::kVistremePlayer.identifier},
+    {Role::ModernMovies, scripting::kVistremePlayerX.identifier},
+    {Role::Presentation, scripting::kSlidewell.identifier},
+    {Role::PhotoLibrary, scripting::kSnapvale.identifier},
+    {Role::ProfessionalPhotos, scripting::kLumbra.identifier},
 };
 
 // clang-format off: one program a line. Within a role the first that is installed is the default.

@@ -1,28 +1,29 @@
 #include "platform/linux/script_world.h"
 
+#include <iterator>
+
 #include "platform/linux/additions.h"
 #include "platform/linux/role_application.h"
+#include "platform/scripting/identity.h"
 #include "platform/scripting/script.h"
-#include "platform/tarnscript/text.h"
 
 namespace desktop {
 
 namespace {
 
 struct Row {
-  const char* identifier;
-  const char* name;
+  scripting::Identity identity;
   tarnscript::Application& (*application)();
 };
 
 constexpr Row kApplications[] = {
-    {"com.tarn.Lyrabox", "Lyrabox", jukebox},
-    {"com.tarn.Spindle", "Spindle", discPlayer},
-    {"com.tarn.vistremeplayer", "VistremePlayer", classicMovies},
-    {"com.tarn.VistremePlayerX", "VistremePlayerX", modernMovies},
-    {"com.tarn.Officra.Slidewell", "Slidewell", presentation},
-    {"com.tarn.Snapvale", "Snapvale", photoLibrary},
-    {"com.tarn.Keyhouse", "Keyhouse", keyhouse},
+    {scripting::kLyrabox, jukebox},
+    {scripting::kSpindle, discPlayer},
+    {scripting::kVistremePlayer, classicMovies},
+    {scripting::kVistremePlayerX, modernMovies},
+    {scripting::kSlidewell, presentation},
+    {scripting::kSnapvale, photoLibrary},
+    {scripting::kKeyhouse, keyhouse},
 };
 
 class World final : public tarnscript::World {
@@ -32,16 +33,8 @@ class World final : public tarnscript::World {
 };
 
 tarnscript::Application* World::find(std::string_view identifierOrName) {
-  for (const Row& row : kApplications) {
-    if (identifierOrName == row.identifier || identifierOrName == row.name) return &row.application();
-  }
-  for (const Row& row : kApplications) {
-    if (tarnscript::equalIgnoringCase(identifierOrName, row.identifier) ||
-        tarnscript::equalIgnoringCase(identifierOrName, row.name)) {
-      return &row.application();
-    }
-  }
-  return nullptr;
+  const auto* const row = scripting::findNamed(kApplications, identifierOrName, &Row::identity);
+  return row != std::end(kApplications) ? &row->application() : nullptr;
 }
 
 }  // namespace
