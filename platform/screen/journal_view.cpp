@@ -9,10 +9,8 @@ namespace live {
 
 namespace {
 
-/// The longest run of rows whose repeats are looked for: more than a repeated button makes.
-constexpr std::size_t kLongestBlock = 24;
-/// Older blocks are forgotten; more than anybody scrolls back through.
-constexpr std::size_t kMostBlocks = 2000;
+/// Older items are forgotten; more than anybody scrolls back through.
+constexpr std::size_t kMostItems = 2000;
 
 constexpr int kIndent = 2;
 
@@ -71,81 +69,39 @@ void JournalView::addCommand(const std::string& command) {
 }
 
 void JournalView::push(Row row) {
-  blocks_.push_back({{std::move(row)}, 1});
-  if (blocks_.size() > kMostBlocks) blocks_.pop_front();
-  bool folded = foldRow();
-  for (std::size_t length = 2; !folded && length <= kLongestBlock; ++length) {
-    folded = foldIntoBlock(length) || foldIntoNewBlock(length);
-  }
+  if (items_.size() == kMostItems) items_.pop_front();
+  stage::addFolding(items_, std::move(row),
+                    [](const Item& item) { return isOneRow(item) && item.thing.line.tone != Tone::Command; });
 }
 
-/// Whether there is a block so far from the end, the last being 1, and it is a single row that may be folded.
-bool JournalView::isRow(std::size_t fromEnd) const {
-  if (fromEnd > blocks_.size()) return false;
-  return (blocks_.end() - static_cast<std::ptrdiff_t>(fromEnd))->rows.size() == 1 &&
-         row(fromEnd).line.tone != Tone::Command;
-}
-
-/// The last row repeats the one before it.
-bool JournalView::foldRow() {
-  if (!isRow(1) || !isRow(2) || row(1).line != row(2).line) return false;
-  blocks_.pop_back();
-  ++blocks_.back().rows[0].count;
-  return true;
-}
-
-/// The last `length` rows repeat the block before them.
-bool JournalView::foldIntoBlock(std::size_t length) {
-  if (blocks_.size() < length + 1) return false;
-  Block& block = *(blocks_.end() - static_cast<std::ptrdiff_t>(length + 1));
-  if (block.rows.size() != length) return false;
-  for (std::size_t i = 0; i < length; ++i) {
-    if (!isRow(length - i) || row(length - i) != block.rows[i]) return false;
-  }
-  ++block.count;
-  blocks_.erase(blocks_.end() - static_cast<std::ptrdiff_t>(length), blocks_.end());
-  return true;
-}
-
-/// The last `length` rows repeat as many before them.
-bool JournalView::foldIntoNewBlock(std::size_t length) {
-  for (std::size_t i = 1; i <= length; ++i) {
-    if (!isRow(i) || !isRow(i + length) || row(i) != row(i + length)) return false;
-  }
-  Block block;
-  block.count = 2;
-  for (std::size_t i = length; i >= 1; --i) block.rows.push_back(row(i));
-  blocks_.erase(blocks_.end() - static_cast<std::ptrdiff_t>(2 * length), blocks_.end());
-  blocks_.push_back(std::move(block));
-  return true;
-}
-
-void JournalView::append(std::vector<Line>& lines, const Row& row, int columns, int indent,
+void JournalView::append(std::vector<Line>& lines, const Item& item, int columns, int indent,
                          bool wholeScripts) {
-  const std::wstring count = row.count > 1 ? L" " + times(row.count) : std::wstring();
-  const auto& [tone, text] = row.line;
-  if (!wholeScripts || row.source.empty()) return appendLine(lines, tone, text + count, columns, indent);
+  const std::wstring count = item.count > 1 ? L" " + times(item.count) : std::wstring();
+  const auto& [line, source, outcome] = item.thing;
+  const auto& [tone, text] = line;
+  if (!wholeScripts || source.empty()) return appendLine(lines, tone, text + count, columns, indent);
   appendLine(lines, tone, text.substr(0, text.find(L':') + 1) + count, columns, indent);
-  for (const std::wstring& part : row.source) appendLine(lines, tone, part, columns, indent + kIndent);
-  if (!row.outcome.empty()) appendLine(lines, Tone::Answer, row.outcome, columns, indent + kIndent);
+  for (const std::wstring& part : source) appendLine(lines, tone, part, columns, indent + kIndent);
+  if (!outcome.empty()) appendLine(lines, Tone::Answer, outcome, columns, indent + kIndent);
 }
 
-std::vector<Line> JournalView::render(const Block& block, int columns, bool wholeScripts) {
+std::vector<Line> JournalView::render(const Item& item, int columns, bool wholeScripts) {
   std::vector<Line> lines;
-  int indent = block.rows[0].line.tone == Tone::Command ? 0 : kIndent;
-  if (block.count > 1) {
-    appendLine(lines, Tone::Answer, times(block.count) + L":", columns, indent);
-    indent += kIndent;
+  const int indent = item.thing.line.tone == Tone::Command ? 0 : kIndent;
+  if (isOneRow(item)) {
+    append(lines, item, columns, indent, wholeScripts);
+    return lines;
   }
-  for (const Row& row : block.rows) append(lines, row, columns, indent, wholeScripts);
+  appendLine(lines, Tone::Answer, times(item.count) + L":", columns, indent);
+  for (const Item& row : item.block) append(lines, row, columns, indent + kIndent, wholeScripts);
   return lines;
 }
 
 std::vector<Line> JournalView::show(int rows, int columns, int& back, bool wholeScripts) const {
   const auto wanted = static_cast<std::size_t>(rows + std::max(back, 0));
   std::vector<Line> upwards;
-  for (auto block = blocks_.rbegin(); block != blocks_.rend() && upwards.size() < wanted; ++block) {
-    const std::vector<Line> lines = render(*block, columns, wholeScripts);
+  for (auto item = items_.rbegin(); item != items_.rend() && upwards.size() < wanted; ++item) {
+    const std::vector<Line> lines = render(*item, columns, wholeScripts);
     upwards.insert(upwards.end(), lines.rbegin(), lines.rend());
   }
   back = std::clamp(back, 0, std::max(0, static_cast<int>(upwards.size()) - rows));

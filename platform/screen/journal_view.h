@@ -1,12 +1,12 @@
 // What the journal's part of the screen shows: lines in the order in which they came, repeats folded.
 #pragma once
 
-#include <cstddef>
 #include <deque>
 #include <string>
 #include <vector>
 
 #include "platform/stage/journal.h"
+#include "platform/stage/repeats.h"
 
 namespace live {
 
@@ -44,27 +44,16 @@ class JournalView {
     /// Of a script: its lines, and what it answered.
     std::vector<std::wstring> source;
     std::wstring outcome;
-    std::size_t count = 1;
     bool operator==(const Row&) const = default;
   };
-  /// One row, or some that came `count` times one after the other.
-  struct Block {
-    std::vector<Row> rows;
-    std::size_t count = 1;
-  };
+  using Item = stage::Folded<Row>;
 
-  bool isRow(std::size_t fromEnd) const;
-  const Row& row(std::size_t fromEnd) const {
-    return (blocks_.end() - static_cast<std::ptrdiff_t>(fromEnd))->rows[0];
-  }
-  bool foldRow();
-  bool foldIntoBlock(std::size_t length);
-  bool foldIntoNewBlock(std::size_t length);
   void push(Row row);
-  static void append(std::vector<Line>& lines, const Row& row, int columns, int indent, bool wholeScripts);
-  static std::vector<Line> render(const Block& block, int columns, bool wholeScripts);
+  static bool isOneRow(const Item& item) { return item.block.size() <= 1; }
+  static void append(std::vector<Line>& lines, const Item& item, int columns, int indent, bool wholeScripts);
+  static std::vector<Line> render(const Item& item, int columns, bool wholeScripts);
 
-  std::deque<Block> blocks_;
+  std::deque<Item> items_;
 };
 
 }  // namespace live

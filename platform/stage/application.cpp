@@ -26,6 +26,9 @@ Application::Application(std::string bundleIdentifier, std::string displayName, 
       name(std::move(displayName)),
       version(std::move(bundleVersion)) {}
 
+Application::Application(const scripting::Identity& identity, std::string bundleVersion)
+    : Application(identity.identifier, identity.name, std::move(bundleVersion)) {}
+
 const tarnscript::Dictionary& Application::dictionary() const { return kNoWords; }
 
 void Application::launch() {

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "platform/host.h"
+#include "platform/scripting/identity.h"
 #include "platform/stage/clock.h"
 #include "platform/tarnscript/tarnscript.h"
 
@@ -24,6 +25,7 @@ enum class Manner {
 class Application : public tarnscript::Application {
  public:
   Application(std::string bundleIdentifier, std::string displayName, std::string bundleVersion);
+  Application(const scripting::Identity& identity, std::string bundleVersion);
   Application(const Application&) = delete;
   Application& operator=(const Application&) = delete;
 

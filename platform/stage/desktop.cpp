@@ -1,10 +1,10 @@
 #include "platform/stage/desktop.h"
 
-#include <strings.h>
-
 #include <algorithm>
+#include <memory>
 #include <string>
 
+#include "platform/scripting/identity.h"
 #include "platform/scripting/movie_dictionaries.h"
 #include "platform/stage/journal.h"
 #include "platform/stage/keyhouse.h"
@@ -20,8 +20,8 @@ namespace stage {
 
 namespace {
 
-bool equalIgnoringCase(std::string_view a, std::string_view b) {
-  return a.size() == b.size() && strncasecmp(a.data(), b.data(), a.size()) == 0;
+scripting::Identity identityOf(const std::unique_ptr<Application>& application) {
+  return {application->identifier.c_str(), application->name.c_str()};
 }
 
 }  // namespace
@@ -35,9 +35,9 @@ void setUpDesktop() {
   auto& installed = desktop().installed;
   installed.push_back(std::make_unique<Lyrabox>());
   installed.push_back(std::make_unique<Spindle>());
-  installed.push_back(std::make_unique<MoviePlayer>("com.tarn.vistremeplayer", "VistremePlayer", "7.6",
+  installed.push_back(std::make_unique<MoviePlayer>(scripting::kVistremePlayer, "7.6",
                                                     scripting::movies::classicDictionary(), 256));
-  installed.push_back(std::make_unique<MoviePlayer>("com.tarn.VistremePlayerX", "VistremePlayerX", "10.0",
+  installed.push_back(std::make_unique<MoviePlayer>(scripting::kVistremePlayerX, "10.0",
                                                     scripting::movies::modernDictionary(), 1));
   installed.push_back(std::make_unique<Slidewell>());
   installed.push_back(std::make_unique<Snapvale>());
@@ -47,18 +47,9 @@ void setUpDesktop() {
 }
 
 Application* findApplication(std::string_view identifierOrName) {
-  for (const auto& application : desktop().installed) {
-    if (application->identifier == identifierOrName || application->name == identifierOrName) {
-      return application.get();
-    }
-  }
-  for (const auto& application : desktop().installed) {
-    if (equalIgnoringCase(application->identifier, identifierOrName) ||
-        equalIgnoringCase(application->name, identifierOrName)) {
-      return application.get();
-    }
-  }
-  return nullptr;
+  const auto& installed = desktop().installed;
+  const auto found = scripting::findNamed(installed, identifierOrName, identityOf);
+  return found != installed.end() ? found->get() : nullptr;
 }
 
 Application* findOrInstallApplication(std::string_view identifierOrName) {

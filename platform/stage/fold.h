@@ -1,17 +1,17 @@
-// Folding: what comes again and again is written once, with how often.
+// Lines of text, those that repeat written once with how often.
 #pragma once
 
 #include <cstddef>
+#include <deque>
 #include <ostream>
 #include <string>
-#include <vector>
 
 #include "platform/stage/clock.h"
+#include "platform/stage/repeats.h"
 
 namespace stage {
 
-/// Collects lines; a block of lines that follows itself is folded into one as it comes in, so that memory
-/// does not grow with the repeats.
+/// Collects lines, and folds them as they come in.
 class Fold {
  public:
   /// `time` is nanoseconds since some beginning; lines that differ in it alone count as the same.
@@ -22,22 +22,18 @@ class Fold {
   bool empty() const { return items_.empty(); }
 
  private:
-  /// A line, or a block of items that occurred `count` times.
-  struct Item {
+  struct Line {
     std::string text;
-    std::vector<Item> block;
-    std::size_t count = 1;
-    Nanoseconds first = 0;
-    Nanoseconds last = 0;
-
-    bool sameAs(const Item& other) const;
+    Nanoseconds time;
+    bool operator==(const Line& other) const { return text == other.text; }
   };
+  using Item = Folded<Line>;
 
-  bool extendBlock(std::size_t length);
-  bool beginBlock(std::size_t length);
-  static void write(std::ostream& output, const std::vector<Item>& items, std::size_t indent);
+  static Nanoseconds firstTime(const Item& item);
+  static void writeTimes(std::ostream& output, const Item& item);
+  static void writeContent(std::ostream& output, const Item& item, std::size_t indent);
 
-  std::vector<Item> items_;
+  std::deque<Item> items_;
 };
 
 /// A length of time for people: "0.05s", "1.05s", "10m", "2h10m".

@@ -7,7 +7,7 @@ namespace stage {
 
 class Keyhouse final : public Application {
  public:
-  Keyhouse() : Application("com.tarn.Keyhouse", "Keyhouse", "1.3") {}
+  Keyhouse() : Application(scripting::kKeyhouse, "1.3") {}
 
   const tarnscript::Dictionary& dictionary() const override;
   /// Belongs to the desktop and needs no start.

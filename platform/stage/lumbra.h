@@ -11,7 +11,7 @@ namespace stage {
 
 class Lumbra final : public Application {
  public:
-  Lumbra() : Application("com.tarn.Lumbra", "Lumbra", "3.4") {}
+  Lumbra() : Application(scripting::kLumbra, "3.4") {}
 
   void receiveKey(std::uint16_t virtualKey, bool withShift) override;
   void ended() override;

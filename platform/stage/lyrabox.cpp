@@ -33,7 +33,7 @@ constexpr std::uint32_t kRemoteSelectEvent = words::code("RSel");
 
 }  // namespace
 
-Lyrabox::Lyrabox() : Application("com.tarn.Lyrabox", "Lyrabox", "4.2") {}
+Lyrabox::Lyrabox() : Application(scripting::kLyrabox, "4.2") {}
 
 const tarnscript::Dictionary& Lyrabox::dictionary() const { return words::dictionary(); }
 

@@ -30,11 +30,9 @@ double numberOf(const Value& value) {
 
 }  // namespace
 
-MoviePlayer::MoviePlayer(std::string bundleIdentifier, std::string displayName, std::string bundleVersion,
+MoviePlayer::MoviePlayer(const scripting::Identity& identity, std::string bundleVersion,
                          const tarnscript::Dictionary& words, double loudest)
-    : Application(std::move(bundleIdentifier), std::move(displayName), std::move(bundleVersion)),
-      words_(words),
-      loudest_(loudest) {}
+    : Application(identity, std::move(bundleVersion)), words_(words), loudest_(loudest) {}
 
 void MoviePlayer::started() {
   movies_ = {{1, "Dune Walk", 600 * kSecond, loudest_ / 2, {}},

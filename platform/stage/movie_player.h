@@ -12,7 +12,7 @@ namespace stage {
 class MoviePlayer final : public Application {
  public:
   /// The volume runs from 0 to `loudest`; in the classic player's words it is a whole number.
-  MoviePlayer(std::string bundleIdentifier, std::string displayName, std::string bundleVersion,
+  MoviePlayer(const scripting::Identity& identity, std::string bundleVersion,
               const tarnscript::Dictionary& words, double loudest);
 
   const tarnscript::Dictionary& dictionary() const override { return words_; }

@@ -17,7 +17,7 @@ constexpr int kSlideCount = 12;
 
 }  // namespace
 
-Slidewell::Slidewell() : Application("com.tarn.Officra.Slidewell", "Slidewell", "6.0") {}
+Slidewell::Slidewell() : Application(scripting::kSlidewell, "6.0") {}
 
 const tarnscript::Dictionary& Slidewell::dictionary() const { return words::dictionary(); }
 

@@ -31,7 +31,7 @@ constexpr std::size_t kDisplayOrder[] = {0, 3, 1, 2, 4, 5, 6};
 
 }  // namespace
 
-Snapvale::Snapvale() : Application("com.tarn.Snapvale", "Snapvale", "8.1.2") {}
+Snapvale::Snapvale() : Application(scripting::kSnapvale, "8.1.2") {}
 
 const tarnscript::Dictionary& Snapvale::dictionary() const { return words::dictionary(); }
 

@@ -33,7 +33,7 @@ Nanoseconds filmLength() { return startOf(kChapterCount + 1); }
 
 }  // namespace
 
-Spindle::Spindle() : Application("com.tarn.Spindle", "Spindle", "5.1"), scanRate_(words::kX2) {}
+Spindle::Spindle() : Application(scripting::kSpindle, "5.1"), scanRate_(words::kX2) {}
 
 const tarnscript::Dictionary& Spindle::dictionary() const { return words::dictionary(); }
 

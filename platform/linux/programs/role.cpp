@@ -1,5 +1,7 @@
 #include "platform/linux/programs/role.h"
 
+#include "platform/scripting/identity.h"
+
 namespace linux::programs {
 
 namespace {
@@ -10,13 +12,13 @@ struct RoleRow {
 };
 
 constexpr RoleRow kIdentifiers[] = {
-    {Role::Jukebox, "com.tarn.Lyrabox"},
-    {Role::DiscPlayer, "com.tarn.Spindle"},
-    {Role::ClassicMovies, "com.tarn.vistremeplayer"},
-    {Role::ModernMovies, "com.tarn.VistremePlayerX"},
-    {Role::Presentation, "com.tarn.Officra.Slidewell"},
-    {Role::PhotoLibrary, "com.tarn.Snapvale"},
-    {Role::ProfessionalPhotos, "com.tarn.Lumbra"},
+    {Role::Jukebox, scripting::kLyrabox.identifier},
+    {Role::DiscPlayer, scripting::kSpindle.identifier},
+    {Role::ClassicMovies, scripting::kVistremePlayer.identifier},
+    {Role::ModernMovies, scripting::kVistremePlayerX.identifier},
+    {Role::Presentation, scripting::kSlidewell.identifier},
+    {Role::PhotoLibrary, scripting::kSnapvale.identifier},
+    {Role::ProfessionalPhotos, scripting::kLumbra.identifier},
 };
 
 }  // namespace

@@ -1,5 +1,7 @@
 #include "platform/linux/roles/world.h"
 
+#include <iterator>
+
 #include "platform/linux/roles/additions.h"
 #include "platform/linux/roles/disc_player.h"
 #include "platform/linux/roles/jukebox.h"
@@ -7,26 +9,25 @@
 #include "platform/linux/roles/movies.h"
 #include "platform/linux/roles/photo_library.h"
 #include "platform/linux/roles/presentation.h"
-#include "platform/tarnscript/text.h"
+#include "platform/scripting/identity.h"
 
 namespace linux::roles {
 
 namespace {
 
 struct Row {
-  const char* identifier;
-  const char* name;
+  scripting::Identity identity;
   tarnscript::Application& (*application)();
 };
 
 constexpr Row kApplications[] = {
-    {"com.tarn.Lyrabox", "Lyrabox", jukebox},
-    {"com.tarn.Spindle", "Spindle", discPlayer},
-    {"com.tarn.vistremeplayer", "VistremePlayer", classicMovies},
-    {"com.tarn.VistremePlayerX", "VistremePlayerX", modernMovies},
-    {"com.tarn.Officra.Slidewell", "Slidewell", presentation},
-    {"com.tarn.Snapvale", "Snapvale", photoLibrary},
-    {"com.tarn.Keyhouse", "Keyhouse", keyhouse},
+    {scripting::kLyrabox, jukebox},
+    {scripting::kSpindle, discPlayer},
+    {scripting::kVistremePlayer, classicMovies},
+    {scripting::kVistremePlayerX, modernMovies},
+    {scripting::kSlidewell, presentation},
+    {scripting::kSnapvale, photoLibrary},
+    {scripting::kKeyhouse, keyhouse},
 };
 
 class World final : public tarnscript::World {
@@ -36,16 +37,8 @@ class World final : public tarnscript::World {
 };
 
 tarnscript::Application* World::find(std::string_view identifierOrName) {
-  for (const Row& row : kApplications) {
-    if (identifierOrName == row.identifier || identifierOrName == row.name) return &row.application();
-  }
-  for (const Row& row : kApplications) {
-    if (tarnscript::equalIgnoringCase(identifierOrName, row.identifier) ||
-        tarnscript::equalIgnoringCase(identifierOrName, row.name)) {
-      return &row.application();
-    }
-  }
-  return nullptr;
+  const auto* const row = scripting::findNamed(kApplications, identifierOrName, &Row::identity);
+  return row != std::end(kApplications) ? &row->application() : nullptr;
 }
 
 }  // namespace
