@@ -3,12 +3,12 @@
 #include <algorithm>
 #include <charconv>
 
-#include "platform/base/utf8.h"
 #include "platform/host.h"
 #include "platform/linux/bus_values.h"
 #include "platform/linux/mpris_names.h"
 #include "platform/linux/roles.h"
 #include "platform/tarnscript/tarnscript.h"
+#include "platform/text/utf8.h"
 
 namespace desktop {
 
@@ -71,7 +71,7 @@ std::string fileName(std::string_view url) {
       name.push_back(part[i]);
     }
   }
-  return base::isUTF8(name) ? name : std::string(part);
+  return text::isUTF8(name) ? name : std::string(part);
 }
 
 void readMetadata(sd_bus_message* message, PlayerState& state) {

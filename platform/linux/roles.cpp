@@ -3,7 +3,7 @@
 #include <algorithm>
 
 #include "platform/scripting/identity.h"
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace desktop {
 
@@ -90,7 +90,7 @@ constexpr std::string_view kBystanders[] = {
 const Program* programBy(const char* Program::*name, std::string_view value) {
   if (value.empty()) return nullptr;
   const auto* const found = std::find_if(std::begin(kPrograms), std::end(kPrograms), [&](const Program& row) {
-    return tarnscript::equalIgnoringCase(row.*name, value);
+    return text::equalIgnoringCase(row.*name, value);
   });
   return found != std::end(kPrograms) ? found : nullptr;
 }

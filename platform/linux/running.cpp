@@ -9,7 +9,7 @@
 
 #include "platform/linux/casting.h"
 #include "platform/tarnscript/tarnscript.h"
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace desktop {
 
@@ -95,7 +95,7 @@ void addPrograms(std::vector<Instance>& found) {
 bool showsOtherDocument(const Client& client, const Instance& instance) {
   constexpr std::string_view kOffice = "libreoffice-";
   return instance.program != nullptr && client.className.starts_with(kOffice) &&
-         !tarnscript::equalIgnoringCase(client.className, instance.program->windowClass);
+         !text::equalIgnoringCase(client.className, instance.program->windowClass);
 }
 
 /// What tells a program apart whose process nobody knows.

@@ -1,12 +1,11 @@
 #include "platform/linux/show_window.h"
 
-#include <strings.h>
-
 #include <algorithm>
 #include <iterator>
 #include <string_view>
 
 #include "platform/linux/gtk_actions.h"
+#include "platform/text/case.h"
 
 namespace desktop {
 
@@ -29,7 +28,7 @@ bool showsInAnotherWindow(const Instance& instance) {
 
 bool isDocument(const Client& client, const Instance& instance) {
   return !client.isDialog && (instance.program == nullptr ||
-                              strcasecmp(client.className.c_str(), instance.program->windowClass) == 0);
+                              text::equalIgnoringCase(client.className, instance.program->windowClass));
 }
 
 }  // namespace
