@@ -1,4 +1,4 @@
-#include "platform/base/xml_reader.h"
+#include "platform/property_list/xml_reader.h"
 
 #include <algorithm>
 #include <charconv>
@@ -7,7 +7,7 @@
 
 #include "platform/text/utf8.h"
 
-namespace base {
+namespace property_list {
 namespace {
 
 constexpr std::string_view kBlanks = " \t\r\n";
@@ -148,4 +148,4 @@ void XmlReader::fail(std::string_view message) const {
   throw Malformed{"line " + std::to_string(line) + ": " + std::string(message)};
 }
 
-}  // namespace base
+}  // namespace property_list
