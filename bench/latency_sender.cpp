@@ -16,9 +16,9 @@
 #include <string>
 #include <vector>
 
+#include "messages/kvd_messages.h"
 #include "platform/mach.h"
 #include "remote/kvd_client.h"
-#include "remote/kvd_messages.h"
 
 namespace {
 

@@ -2,7 +2,7 @@
 # and the seam.
 
 set(allowed
-  "^(<[a-z_]+>|\"(daemon|routing|registry|adapters)/[a-z_]+\\.h\"|\"platform/(host|mach)\\.h\"|\"remote/kvd_messages\\.h\")$")
+  "^(<[a-z_]+>|\"(daemon|routing|registry|adapters)/[a-z_]+\\.h\"|\"platform/(host|mach)\\.h\"|\"messages/kvd_messages\\.h\")$")
 
 set(refused "")
 math(EXPR last "${CMAKE_ARGC} - 1")
@@ -19,5 +19,5 @@ endforeach()
 
 if(refused)
   message(FATAL_ERROR "The core may include the standard library, its own headers, platform/host.h, "
-    "platform/mach.h and remote/kvd_messages.h only:${refused}")
+    "platform/mach.h and messages/kvd_messages.h only:${refused}")
 endif()

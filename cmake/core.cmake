@@ -27,8 +27,8 @@ set(core_sources
 )
 
 set(core_include ${CMAKE_BINARY_DIR}/core-include)
-file(MAKE_DIRECTORY ${core_include}/platform ${core_include}/remote)
-foreach(visible daemon routing registry adapters platform/host.h platform/mach.h remote/kvd_messages.h)
+file(MAKE_DIRECTORY ${core_include}/platform ${core_include}/messages)
+foreach(visible daemon routing registry adapters platform/host.h platform/mach.h messages/kvd_messages.h)
   file(CREATE_LINK ${PROJECT_SOURCE_DIR}/${visible} ${core_include}/${visible} SYMBOLIC)
 endforeach()
 

@@ -1,12 +1,12 @@
 // The daemon's side of the control messages, by the conventions of the Mach Interface Generator: checks,
-// decoding, the reply record, and the table that other code can find the routines in. remote/kvd_messages.h
+// decoding, the reply record, and the table that other code can find the routines in. messages/kvd_messages.h
 // has the layouts.
 #pragma once
 
 #include <cstddef>
 
+#include "messages/kvd_messages.h"
 #include "platform/host.h"
-#include "remote/kvd_messages.h"
 
 /// Decodes one request and runs its work routine.
 using mig_routine_t = void (*)(mach_msg_header_t* request, mach_msg_header_t* reply);

@@ -7,9 +7,9 @@
 #include <cstdio>
 #include <ctime>
 
+#include "messages/kvd_messages.h"
 #include "platform/mach.h"
 #include "remote/kvd_client.h"
-#include "remote/kvd_messages.h"
 
 namespace remote {
 namespace {

@@ -1,6 +1,6 @@
 #include "remote/kvd_client.h"
 
-#include "remote/kvd_messages.h"
+#include "messages/kvd_messages.h"
 
 namespace {
 

@@ -3,8 +3,8 @@
 #include <limits>
 #include <unordered_map>
 
-#include "platform/base/utf8.h"
 #include "platform/base/values.h"
+#include "platform/text/utf8.h"
 
 namespace base {
 
@@ -33,7 +33,7 @@ HostStringRef HostGetConstantString(const char* text) {
 }
 
 HostStringRef HostCreateStringFromUTF8(const char* bytes) {
-  if (bytes == nullptr || !base::isUTF8(bytes)) return nullptr;
+  if (bytes == nullptr || !text::isUTF8(bytes)) return nullptr;
   return HostStringRef(base::makeTemporary(new String(bytes)));
 }
 

@@ -5,10 +5,10 @@
 #include <utility>
 
 #include "daemon/kvd.h"
-#include "platform/base/utf8.h"
 #include "platform/screen/catalogue.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/director.h"
+#include "platform/text/utf8.h"
 
 namespace live {
 
@@ -16,7 +16,7 @@ namespace {
 
 std::string narrow(std::wstring_view wide) {
   std::string text;
-  for (const wchar_t character : wide) base::appendUTF8(text, static_cast<char32_t>(character));
+  for (const wchar_t character : wide) text::appendUTF8(text, static_cast<char32_t>(character));
   return text;
 }
 

@@ -4,9 +4,8 @@
 
 #include <algorithm>
 #include <cstddef>
-#include <cstdint>
 
-#include "platform/base/utf8.h"
+#include "platform/text/utf8.h"
 
 namespace live {
 
@@ -16,16 +15,6 @@ constexpr wchar_t kReplacement = L'\uFFFD';
 constexpr wchar_t kEllipsis = L'…';
 
 int width(wchar_t character) { return wcwidth(character); }
-
-/// The character whose first byte is at `at`, which moves behind it; the text must be UTF-8.
-wchar_t decode(std::string_view text, std::size_t& at) {
-  const auto lead = static_cast<unsigned char>(text[at++]);
-  if (lead < 0x80) return static_cast<wchar_t>(lead);
-  const int following = lead < 0xE0 ? 1 : lead < 0xF0 ? 2 : 3;
-  std::uint32_t code = lead & (0x3Fu >> following);
-  for (int i = 0; i < following; ++i) code = code << 6 | (static_cast<unsigned char>(text[at++]) & 0x3Fu);
-  return static_cast<wchar_t>(code);
-}
 
 /// How many characters, at least one, fit into so many columns.
 std::size_t fitting(std::wstring_view text, int columns) {
@@ -41,13 +30,13 @@ std::size_t fitting(std::wstring_view text, int columns) {
 
 std::wstring widen(std::string_view utf8) {
   std::wstring wide;
-  if (!base::isUTF8(utf8)) {
+  if (!text::isUTF8(utf8)) {
     for (const char byte : utf8)
       wide += byte >= ' ' && byte <= '~' ? static_cast<wchar_t>(byte) : kReplacement;
     return wide;
   }
-  for (std::size_t at = 0; at < utf8.size();) {
-    const wchar_t character = decode(utf8, at);
+  while (const auto taken = text::takeCharacter(utf8)) {
+    const auto character = static_cast<wchar_t>(*taken);
     const bool isControl = character < L' ' || (character >= 0x7F && character < 0xA0);
     // What the locale cannot show would upset the count of columns.
     wide += isControl ? L' ' : width(character) < 0 ? kReplacement : character;

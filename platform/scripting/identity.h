@@ -6,7 +6,7 @@
 #include <iterator>
 #include <string_view>
 
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace scripting {
 
@@ -40,7 +40,7 @@ auto findNamed(const Applications& applications, std::string_view text, Identity
     });
   };
   const auto exact = find(std::equal_to<std::string_view>());
-  return exact != std::end(applications) ? exact : find(tarnscript::equalIgnoringCase);
+  return exact != std::end(applications) ? exact : find(text::equalIgnoringCase);
 }
 
 }  // namespace scripting

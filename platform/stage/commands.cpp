@@ -6,6 +6,7 @@
 #include <type_traits>
 #include <vector>
 
+#include "messages/kvd_messages.h"
 #include "platform/mach.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/director.h"
@@ -16,7 +17,6 @@
 #include "platform/stage/transcript.h"
 #include "remote/buttons.h"
 #include "remote/kvd_client.h"
-#include "remote/kvd_messages.h"
 #include "remote/words.h"
 
 namespace stage {

@@ -7,10 +7,10 @@
 #include <optional>
 #include <string>
 
+#include "messages/kvd_messages.h"
 #include "platform/base/port.h"
 #include "platform/stage/director.h"
 #include "remote/buttons.h"
-#include "remote/kvd_messages.h"
 
 namespace stage {
 

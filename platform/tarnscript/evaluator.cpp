@@ -2,7 +2,7 @@
 
 #include <utility>
 
-#include "platform/tarnscript/text.h"
+#include "platform/text/utf8.h"
 
 namespace tarnscript {
 
@@ -199,7 +199,7 @@ Value Evaluator::compute(const Count& node) {
     return static_cast<std::int64_t>(elementsOf(*list).size());
   const auto* text = std::get_if<std::string>(&value);
   if (text == nullptr) throw Failure{"cannot count " + std::string(kindName(value))};
-  return static_cast<std::int64_t>(characterCount(*text));
+  return static_cast<std::int64_t>(text::characterCount(*text));
 }
 
 Value Evaluator::compute(const ListLiteral& node) {

@@ -2,7 +2,7 @@
 #include <utility>
 
 #include "platform/tarnscript/evaluator.h"
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace tarnscript {
 
@@ -25,7 +25,7 @@ const ObjectRef& Evaluator::told() const {
 
 const PropertyTerm* Evaluator::findProperty(const ObjectRef& object, std::string_view words) {
   for (const PropertyTerm& term : object.application->dictionary().properties) {
-    if (term.owner == object.cls && equalIgnoringCase(term.words, words)) return &term;
+    if (term.owner == object.cls && text::equalIgnoringCase(term.words, words)) return &term;
   }
   return nullptr;
 }
@@ -73,7 +73,7 @@ Value Evaluator::getField(const Record& record, std::string_view words) {
   const auto fieldIn = [&](const Dictionary& dictionary) -> const Value* {
     for (const PropertyTerm& term : dictionary.properties) {
       const auto field = record->find(term.code);
-      if (field != record->end() && equalIgnoringCase(term.words, words)) return &field->second;
+      if (field != record->end() && text::equalIgnoringCase(term.words, words)) return &field->second;
     }
     return nullptr;
   };

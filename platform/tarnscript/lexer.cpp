@@ -5,7 +5,8 @@
 #include <utility>
 
 #include "platform/tarnscript/tarnscript.h"
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
+#include "platform/text/utf8.h"
 
 namespace tarnscript {
 
@@ -54,7 +55,7 @@ constexpr auto kKeywords = std::to_array<std::pair<std::string_view, Keyword>>({
 constexpr auto kKeywordSlots = [] {
   std::array<std::uint8_t, 128> slots{};
   for (std::size_t i = 0; i < kKeywords.size(); ++i) {
-    std::size_t slot = foldedHash(kKeywords[i].first) % slots.size();
+    std::size_t slot = text::foldedHash(kKeywords[i].first) % slots.size();
     while (slots[slot] != 0) slot = (slot + 1) % slots.size();
     slots[slot] = static_cast<std::uint8_t>(i + 1);
   }
@@ -65,7 +66,7 @@ Keyword findKeyword(std::string_view word, std::uint32_t hash) {
   for (std::size_t slot = hash % kKeywordSlots.size(); kKeywordSlots[slot] != 0;
        slot = (slot + 1) % kKeywordSlots.size()) {
     const auto& [text, keyword] = kKeywords[kKeywordSlots[slot] - 1U];
-    if (equalIgnoringCase(text, word)) return keyword;
+    if (text::equalIgnoringCase(text, word)) return keyword;
   }
   return Keyword::None;
 }
@@ -101,7 +102,7 @@ const auto* findSymbol(std::string_view text) {
 }
 
 constexpr bool isDigit(char c) { return c >= '0' && c <= '9'; }
-constexpr bool isLetter(char c) { return (foldCase(c) >= 'a' && foldCase(c) <= 'z') || c == '_'; }
+constexpr bool isLetter(char c) { return (text::foldCase(c) >= 'a' && text::foldCase(c) <= 'z') || c == '_'; }
 constexpr bool isBeyondAscii(char c) { return static_cast<unsigned char>(c) >= 0x80; }
 
 class Lexer {
@@ -172,7 +173,7 @@ class Lexer {
       kind = TokenKind::Real;
       length = digits(length + 1);
     }
-    if (length < rest_.size() && foldCase(rest_[length]) == 'e') {
+    if (length < rest_.size() && text::foldCase(rest_[length]) == 'e') {
       const bool isSigned =
           length + 1 < rest_.size() && (rest_[length + 1] == '+' || rest_[length + 1] == '-');
       const std::size_t exponent = length + (isSigned ? 2 : 1);
@@ -201,7 +202,7 @@ class Lexer {
       ++length;
     }
     const std::string_view text = rest_.substr(0, length);
-    const std::uint32_t hash = foldedHash(text);
+    const std::uint32_t hash = text::foldedHash(text);
     const Keyword keyword = findKeyword(text, hash);
     if (keyword == Keyword::The) {
       rest_.remove_prefix(length);
@@ -227,7 +228,7 @@ class Lexer {
 }  // namespace
 
 std::vector<Token> tokenize(std::string_view source) {
-  if (const std::size_t bad = findInvalidUTF8(source); bad != std::string_view::npos) {
+  if (const std::size_t bad = text::findInvalidUTF8(source); bad != std::string_view::npos) {
     const auto before = source.substr(0, bad);
     throw Error{"the source is not valid UTF-8",
                 1 + static_cast<int>(std::count(before.begin(), before.end(), '\n'))};

@@ -13,8 +13,8 @@
 
 #include "platform/tarnscript/lexer.h"
 #include "platform/tarnscript/syntax.h"
-#include "platform/tarnscript/text.h"
 #include "platform/tarnscript/vocabulary.h"
+#include "platform/text/case.h"
 
 namespace tarnscript {
 
@@ -121,10 +121,10 @@ class Parser {
   const Vocabulary* told_ = nullptr;
 
   struct FoldedHash {
-    std::size_t operator()(std::string_view word) const { return foldedHash(word); }
+    std::size_t operator()(std::string_view word) const { return text::foldedHash(word); }
   };
   struct FoldedEqual {
-    bool operator()(std::string_view a, std::string_view b) const { return equalIgnoringCase(a, b); }
+    bool operator()(std::string_view a, std::string_view b) const { return text::equalIgnoringCase(a, b); }
   };
   std::unordered_map<std::string_view, std::uint32_t, FoldedHash, FoldedEqual> slots_;
 };

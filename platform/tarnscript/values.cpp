@@ -8,7 +8,8 @@
 #include <limits>
 #include <utility>
 
-#include "platform/tarnscript/text.h"
+#include "platform/tarnscript/number_text.h"
+#include "platform/text/case.h"
 
 namespace tarnscript {
 
@@ -145,7 +146,7 @@ bool equal(const Value& a, const Value& b, Budget& budget) {
     return x && y && *x == *y;
   }
   if (const auto* text = std::get_if<std::string>(&a))
-    return equalIgnoringCase(*text, std::get<std::string>(b));
+    return text::equalIgnoringCase(*text, std::get<std::string>(b));
   if (const auto* list = std::get_if<List>(&a)) {
     const auto x = elementsOf(*list);
     const auto y = elementsOf(std::get<List>(b));
@@ -173,7 +174,7 @@ namespace {
 int order(const Value& a, const Value& b) {
   const auto* text = std::get_if<std::string>(&a);
   const auto* other = std::get_if<std::string>(&b);
-  if (text != nullptr && other != nullptr) return compareIgnoringCase(*text, *other);
+  if (text != nullptr && other != nullptr) return text::compareIgnoringCase(*text, *other);
   const auto x = asReal(a);
   const auto y = asReal(b);
   if (!x || !y) {

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace tarnscript {
 
@@ -12,7 +12,7 @@ std::size_t matchWords(std::span<const Token> tokens, std::string_view words) {
     const std::size_t end = std::min(words.find(' '), words.size());
     // The last token is never a word, so this cannot run off the end.
     if (tokens[length].kind != TokenKind::Word) return 0;
-    if (!equalIgnoringCase(tokens[length].text, words.substr(0, end))) return 0;
+    if (!text::equalIgnoringCase(tokens[length].text, words.substr(0, end))) return 0;
     ++length;
     words.remove_prefix(std::min(end + 1, words.size()));
   }
@@ -33,7 +33,7 @@ Vocabulary::Vocabulary(Application& application)
 }
 
 void Vocabulary::add(std::string_view words, Kind kind, std::size_t index) {
-  auto& bucket = buckets_[foldedHash(words.substr(0, words.find(' '))) % buckets_.size()];
+  auto& bucket = buckets_[text::foldedHash(words.substr(0, words.find(' '))) % buckets_.size()];
   entries_.push_back(Entry{words, kind, static_cast<std::uint32_t>(index), bucket});
   bucket = static_cast<std::uint32_t>(entries_.size());
 }

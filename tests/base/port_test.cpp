@@ -15,7 +15,7 @@
 #include "platform/base/port_names.h"
 #include "platform/base/run_loop.h"
 #include "platform/base/sockets.h"
-#include "tests/base/temporary_directory.h"
+#include "tests/temporary_directory.h"
 
 namespace {
 

@@ -74,9 +74,9 @@ TEST(Registry, TellsTheFrontmostApplication) {
   };
   for (const auto& [identifier, code] : rows) {
     EXPECT_EQ(inChild([&] {
-                const std::string nobody = text(FrontProcessID());
+                const std::string nobody = codeText(FrontProcessID());
                 set(std::string("open ") + identifier + "; front " + identifier);
-                return nobody + " " + text(FrontProcessID()) + " " + stage::aliveText();
+                return nobody + " " + codeText(FrontProcessID()) + " " + stage::aliveText();
               }),
               "none " + std::string(code) + " nothing");
   }
@@ -157,7 +157,7 @@ TEST(Bridge, TurnsResultsIntoNumbersAndCodes) {
                 set("open lyrabox");
                 HandleScript(row.source);
                 return std::to_string(HandleScriptWithIntegerResult(row.source)) + " " +
-                       text(HandleScriptWithOSTypeResult(row.source)) + " " + stage::aliveText();
+                       codeText(HandleScriptWithOSTypeResult(row.source)) + " " + stage::aliveText();
               }),
               std::to_string(row.integer) + " " + row.code + " nothing")
         << (row.source != nullptr ? row.source : "null");

@@ -100,4 +100,4 @@ std::string journal() { return std::exchange(sJournal, {}); }
 
 std::string sent() { return std::exchange(sSent, {}); }
 
-std::string text(FourCharCode code) { return stage::fourCharacters(code); }
+std::string codeText(FourCharCode code) { return stage::fourCharacters(code); }

@@ -28,7 +28,7 @@ std::string journal();
 std::string sent();
 
 /// A four-character code as text.
-std::string text(FourCharCode code);
+std::string codeText(FourCharCode code);
 
 /// A packed button event of these keys.
 constexpr PackedHIDEvent eventOf(UsageKey key) { return key >> 16 | (key & 0xFFFF) << 16; }

@@ -26,7 +26,7 @@ std::string targetsAfter(const std::vector<Step>& steps) {
       set(step.before);
       refreshCachedASNs();
       sTargetApplication = App::Nval;
-      targets += text(targetApplication()) + " ";
+      targets += codeText(targetApplication()) + " ";
     }
     return targets;
   });
@@ -80,14 +80,14 @@ TEST(Target, IsAskedOncePerEvent) {
   EXPECT_EQ(inChild([] {
               set("open lyrabox");
               refreshCachedASNs();
-              std::string targets = text(targetApplication());
+              std::string targets = codeText(targetApplication());
               set("open com.tarn.Spindle; front com.tarn.Spindle; close lyrabox");
-              targets += text(targetApplication());
+              targets += codeText(targetApplication());
               DispatchHIDEvent(eventOf(Key::Menu), 1, false);
-              targets += text(targetApplication());
+              targets += codeText(targetApplication());
               set("close com.tarn.Spindle");
               DispatchHIDEvent(eventOf(Key::Menu), 1, false);
-              targets += text(targetApplication());
+              targets += codeText(targetApplication());
               journal();
               targetApplication();
               return targets + " " + journal();
@@ -156,7 +156,7 @@ TEST(Lyrabox, OffersCommandsAndQueriesToOthers) {
   EXPECT_EQ(inChild([] {
               set("open lyrabox; tell lyrabox to play");
               const auto state = [] {
-                return text(LyraboxPlayerState()) + (LyraboxIsPlaying() ? " plays; " : " silent; ");
+                return codeText(LyraboxPlayerState()) + (LyraboxIsPlaying() ? " plays; " : " silent; ");
               };
               std::string states = state();
               LyraboxCommand_Pause();

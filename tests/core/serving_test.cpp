@@ -16,8 +16,8 @@
 #include <vector>
 
 #include "daemon/kvd.h"
+#include "messages/kvd_messages.h"
 #include "remote/kvd_client.h"
-#include "remote/kvd_messages.h"
 
 namespace {
 

@@ -58,7 +58,7 @@ TEST(Silence, ReachesEveryOtherThatRuns) {
                     SilenceAllBut(code);
                     const std::string actual = named(sent());
                     if (actual != expected)
-                      wrong.append(text(code)).append(", " + state + ": ").append(actual);
+                      wrong.append(codeText(code)).append(", " + state + ": ").append(actual);
                   }
                 }
                 return wrong;

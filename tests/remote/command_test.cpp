@@ -7,10 +7,10 @@
 #include <sstream>
 #include <tuple>
 
+#include "messages/kvd_messages.h"
 #include "remote/arguments.h"
 #include "remote/buttons.h"
 #include "remote/deliver.h"
-#include "remote/kvd_messages.h"
 #include "tests/remote/fake_mach.h"
 
 namespace {

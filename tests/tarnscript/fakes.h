@@ -11,8 +11,9 @@
 #include <utility>
 #include <vector>
 
+#include "platform/tarnscript/number_text.h"
 #include "platform/tarnscript/tarnscript.h"
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace tarnscript {
 
@@ -198,7 +199,7 @@ class FakeWorld : public World {
   }
 
   Application* find(std::string_view name) override {
-    if (equalIgnoringCase(name, "com.tarn.Player")) return &player;
+    if (text::equalIgnoringCase(name, "com.tarn.Player")) return &player;
     return name == "Keyhouse" ? &helper : nullptr;
   }
   Application& additions() override { return extras; }

@@ -3,10 +3,10 @@
 #include <algorithm>
 #include <charconv>
 
-#include "platform/base/utf8.h"
 #include "platform/linux/players/mpris_names.h"
 #include "platform/linux/system/bus_values.h"
 #include "platform/tarnscript/tarnscript.h"
+#include "platform/text/utf8.h"
 
 namespace linux::players {
 
@@ -74,7 +74,7 @@ std::string fileName(std::string_view url) {
       name.push_back(part[i]);
     }
   }
-  return base::isUTF8(name) ? name : std::string(part);
+  return text::isUTF8(name) ? name : std::string(part);
 }
 
 void readMetadata(sd_bus_message* message, PlayerState& state) {

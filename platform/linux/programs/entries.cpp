@@ -13,7 +13,7 @@
 
 #include "platform/base/subprocess.h"
 #include "platform/linux/programs/entry_records.h"
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace linux::programs {
 
@@ -118,13 +118,13 @@ const std::vector<Entry>& entries() {
 
 const Entry* entryByID(std::string_view id) {
   if (id.empty()) return nullptr;
-  return find([&](const Entry& entry) { return tarnscript::equalIgnoringCase(entry.id, id); });
+  return find([&](const Entry& entry) { return text::equalIgnoringCase(entry.id, id); });
 }
 
 const Entry* entryByWindowClass(std::string_view windowClass) {
   if (windowClass.empty()) return nullptr;
   const Entry* const found =
-      find([&](const Entry& entry) { return tarnscript::equalIgnoringCase(entry.windowClass, windowClass); });
+      find([&](const Entry& entry) { return text::equalIgnoringCase(entry.windowClass, windowClass); });
   return found != nullptr ? found : entryByID(windowClass);
 }
 

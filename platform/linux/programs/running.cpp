@@ -10,7 +10,7 @@
 #include "platform/linux/programs/casting.h"
 #include "platform/linux/system/process.h"
 #include "platform/tarnscript/tarnscript.h"
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace linux::programs {
 
@@ -39,7 +39,7 @@ bool anyBelongsTo(const Instance& instance) {
 bool showsOtherDocument(const Window& window, const Instance& instance) {
   const Program* const program = instance.program;
   return program != nullptr && *program->suite != '\0' && window.className.starts_with(program->suite) &&
-         !tarnscript::equalIgnoringCase(window.className, program->windowClass);
+         !text::equalIgnoringCase(window.className, program->windowClass);
 }
 
 Instance instanceOf(Casting casting) {

@@ -9,7 +9,7 @@
 #include "platform/scripting/slidewell_dictionary.h"
 #include "platform/scripting/snapvale_dictionary.h"
 #include "platform/scripting/spindle_dictionary.h"
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace linux::programs {
 
@@ -197,7 +197,7 @@ constexpr std::string_view kBystanders[] = {
 const Program* programBy(const char* Program::*name, std::string_view value) {
   if (value.empty()) return nullptr;
   const auto* const found = std::find_if(std::begin(kPrograms), std::end(kPrograms), [&](const Program& row) {
-    return tarnscript::equalIgnoringCase(row.*name, value);
+    return text::equalIgnoringCase(row.*name, value);
   });
   return found != std::end(kPrograms) ? found : nullptr;
 }

@@ -4,7 +4,7 @@
 
 #include "platform/linux/players/gtk_actions.h"
 #include "platform/linux/players/mpris.h"
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace linux::roles {
 
@@ -18,9 +18,8 @@ ShowStyle styleOf(const Performer& performer) {
 }
 
 bool isDocument(const Window& window, const Performer& performer) {
-  return !window.isDialog &&
-         (performer.program() == nullptr ||
-          tarnscript::equalIgnoringCase(window.className, performer.program()->windowClass));
+  return !window.isDialog && (performer.program() == nullptr ||
+                              text::equalIgnoringCase(window.className, performer.program()->windowClass));
 }
 
 /// Some tell their show as a player's status: stopped is their ordinary window.

@@ -3,6 +3,8 @@
 #include <cmath>
 #include <cstdint>
 
+#include "platform/text/utf8.h"
+
 namespace linux::system {
 
 namespace {
@@ -21,22 +23,13 @@ std::optional<double> readAs(sd_bus_message* message, char type) {
   return static_cast<double>(*value);
 }
 
-/// Cut where a character begins, so that it stays UTF-8.
-std::string shortened(std::string_view text) {
-  std::size_t length = std::min(text.size(), kLongestText);
-  while (length < text.size() && length > 0 && (static_cast<unsigned char>(text[length]) & 0xC0) == 0x80) {
-    --length;
-  }
-  return std::string(text.substr(0, length));
-}
-
 }  // namespace
 
 std::optional<std::string> readText(sd_bus_message* message, std::string_view type) {
   if (type != "s" && type != "o") return std::nullopt;
   const auto text = readBasic<const char*>(message, type.front());
   if (!text) return std::nullopt;
-  return shortened(*text);
+  return std::string(text::truncated(*text, kLongestText));
 }
 
 std::optional<double> readNumber(sd_bus_message* message, std::string_view type) {

@@ -5,7 +5,7 @@
 #include <optional>
 #include <string_view>
 
-#include "platform/tarnscript/text.h"
+#include "platform/text/case.h"
 
 namespace linux::windows {
 
@@ -21,9 +21,9 @@ std::vector<Window> sWindows;
 std::vector<std::vector<ID>> sIDs;
 
 bool isOneOf(std::string_view name, const Window& window) {
-  return !name.empty() && (tarnscript::equalIgnoringCase(name, window.applicationID) ||
-                           tarnscript::equalIgnoringCase(name, window.className) ||
-                           tarnscript::equalIgnoringCase(name, window.instanceName));
+  return !name.empty() && (text::equalIgnoringCase(name, window.applicationID) ||
+                           text::equalIgnoringCase(name, window.className) ||
+                           text::equalIgnoringCase(name, window.instanceName));
 }
 
 /// Whether two back ends may speak of the same window. Where a process is known, the compositor's and the X

@@ -1,13 +1,13 @@
-#include "platform/base/xml_reader.h"
+#include "platform/property_list/xml_reader.h"
 
 #include <algorithm>
 #include <charconv>
 #include <cstdint>
 #include <utility>
 
-#include "platform/base/utf8.h"
+#include "platform/text/utf8.h"
 
-namespace base {
+namespace property_list {
 namespace {
 
 constexpr std::string_view kBlanks = " \t\r\n";
@@ -26,7 +26,7 @@ bool isXmlCharacter(std::uint32_t c) {
 }  // namespace
 
 void XmlReader::begin() {
-  if (!std::ranges::all_of(rest_, isTextCharacter) || !isUTF8(rest_)) fail("this is not text in UTF-8");
+  if (!std::ranges::all_of(rest_, isTextCharacter) || !text::isUTF8(rest_)) fail("this is not text in UTF-8");
   skip("\xEF\xBB\xBF");
   if (skip("<?xml ")) takeUntil("?>");
   skipBetweenTags();
@@ -65,7 +65,7 @@ std::string XmlReader::readText(const Tag& tag) {
     text += rest_.substr(0, length);
     rest_.remove_prefix(length);
     if (skip("&")) {
-      appendUTF8(text, readReference());
+      text::appendUTF8(text, readReference());
     } else if (skip("<![CDATA[")) {
       text += takeUntil("]]>");
     } else if (skip("<!--")) {
@@ -148,4 +148,4 @@ void XmlReader::fail(std::string_view message) const {
   throw Malformed{"line " + std::to_string(line) + ": " + std::string(message)};
 }
 
-}  // namespace base
+}  // namespace property_list

@@ -3,12 +3,19 @@
 #include <charconv>
 #include <map>
 
-#include "platform/base/base64.h"
 #include "platform/base/values.h"
-#include "platform/base/xml_reader.h"
+#include "platform/property_list/base64.h"
+#include "platform/property_list/xml_reader.h"
 
-namespace base {
+namespace property_list {
 namespace {
+
+using base::Data;
+using base::Dictionary;
+using base::List;
+using base::Number;
+using base::Owned;
+using base::String;
 
 /// An application's property list has some kilobytes; reading stays short whatever is handed in.
 constexpr std::size_t kLargestPropertyList = 4u << 20;
@@ -17,9 +24,9 @@ constexpr int kDeepestNesting = 64;
 
 using Tag = XmlReader::Tag;
 
-class PropertyListReader {
+class Reader {
  public:
-  explicit PropertyListReader(std::string_view document) : xml_(document) {}
+  explicit Reader(std::string_view document) : xml_(document) {}
 
   Owned<HostObject> readDocument();
 
@@ -34,7 +41,7 @@ class PropertyListReader {
   XmlReader xml_;
 };
 
-Owned<HostObject> PropertyListReader::readDocument() {
+Owned<HostObject> Reader::readDocument() {
   xml_.begin();
   const Tag root = xml_.openTag(true);
   if (root.name != "plist" || root.closed) xml_.fail("a property list begins with <plist>");
@@ -46,14 +53,14 @@ Owned<HostObject> PropertyListReader::readDocument() {
   return value;
 }
 
-Owned<HostObject> PropertyListReader::readValue(const Tag& tag, int depth) {
+Owned<HostObject> Reader::readValue(const Tag& tag, int depth) {
   if (depth > kDeepestNesting) xml_.fail("the property list is nested too deeply");
   if (tag.name == "dict") return readDictionary(tag, depth);
   if (tag.name == "array") return readList(tag, depth);
   return readScalar(tag);
 }
 
-Owned<HostObject> PropertyListReader::readDictionary(const Tag& tag, int depth) {
+Owned<HostObject> Reader::readDictionary(const Tag& tag, int depth) {
   std::map<std::string, Owned<HostObject>> values;
   for (xml_.skipBetweenTags(); !tag.closed && !xml_.atClosingTag(); xml_.skipBetweenTags()) {
     const Tag key = xml_.openTag();
@@ -68,7 +75,7 @@ Owned<HostObject> PropertyListReader::readDictionary(const Tag& tag, int depth) 
   return Owned<HostObject>(new Dictionary(std::move(entries)));
 }
 
-Owned<HostObject> PropertyListReader::readList(const Tag& tag, int depth) {
+Owned<HostObject> Reader::readList(const Tag& tag, int depth) {
   std::vector<Owned<HostObject>> values;
   for (xml_.skipBetweenTags(); !tag.closed && !xml_.atClosingTag(); xml_.skipBetweenTags()) {
     values.push_back(readValue(xml_.openTag(), depth + 1));
@@ -87,7 +94,7 @@ bool isDate(std::string_view text) {
 }
 
 template <typename Value>
-Value PropertyListReader::numberIn(std::string_view text) const {
+Value Reader::numberIn(std::string_view text) const {
   Value value{};
   if (text.starts_with('+') && !text.starts_with("+-")) text.remove_prefix(1);
   const char* end = text.data() + text.size();
@@ -96,7 +103,7 @@ Value PropertyListReader::numberIn(std::string_view text) const {
   return value;
 }
 
-Owned<HostObject> PropertyListReader::readScalar(const Tag& tag) {
+Owned<HostObject> Reader::readScalar(const Tag& tag) {
   std::string text = xml_.readText(tag);
   if (tag.name == "string") return Owned<HostObject>(new String(std::move(text)));
   if (tag.name == "integer") return Owned<HostObject>(new Number(numberIn<std::int64_t>(text)));
@@ -112,18 +119,18 @@ Owned<HostObject> PropertyListReader::readScalar(const Tag& tag) {
 }
 
 }  // namespace
-}  // namespace base
+}  // namespace property_list
 
 HostDictionaryRef HostParsePropertyList(HostDataRef data, HostStringRef* errorText) {
   if (errorText != nullptr) *errorText = nullptr;
   std::string problem = "there are no data, or too many";
   const auto* source = base::as<base::Data>(data);
-  if (source != nullptr && source->bytes.size() <= base::kLargestPropertyList) {
+  if (source != nullptr && source->bytes.size() <= property_list::kLargestPropertyList) {
     try {
-      auto value = base::PropertyListReader(source->bytes).readDocument();
+      auto value = property_list::Reader(source->bytes).readDocument();
       if (base::as<base::Dictionary>(value.get()) != nullptr) return HostDictionaryRef(value.release());
       problem = "the property list is no dictionary";
-    } catch (const base::Malformed& malformed) {
+    } catch (const property_list::Malformed& malformed) {
       problem = malformed.message;
     }
   }

@@ -5,7 +5,7 @@
 #include <string>
 #include <string_view>
 
-namespace base {
+namespace property_list {
 
 /// Thrown where a document is malformed; the message begins with the line.
 struct Malformed {
@@ -52,4 +52,4 @@ class XmlReader {
   std::string_view rest_;
 };
 
-}  // namespace base
+}  // namespace property_list

@@ -1,8 +1,8 @@
-#include "platform/base/base64.h"
+#include "platform/property_list/base64.h"
 
 #include <cstdint>
 
-namespace base {
+namespace property_list {
 
 std::optional<std::string> decodeBase64(std::string_view text) {
   static constexpr std::string_view digits =
@@ -24,4 +24,4 @@ std::optional<std::string> decodeBase64(std::string_view text) {
   return bytes;
 }
 
-}  // namespace base
+}  // namespace property_list

@@ -4,7 +4,7 @@
 #include <sstream>
 
 #include "platform/base/values.h"
-#include "tests/base/temporary_directory.h"
+#include "tests/temporary_directory.h"
 
 namespace {
 
