@@ -6,16 +6,6 @@
 #include "platform/base/values.h"
 #include "platform/text/utf8.h"
 
-namespace base {
-
-const std::string& textOf(HostStringRef string) {
-  static const std::string empty;
-  const auto* found = as<String>(string);
-  return found != nullptr ? found->text : empty;
-}
-
-}  // namespace base
-
 using base::as;
 using base::String;
 
@@ -31,6 +21,10 @@ HostStringRef HostGetConstantString(const char* text) {
   strings.emplace(made->text, made);
   return HostStringRef(made);
 }
+
+HostStringRef HostGetBundleIdentifierKey() { return HostGetConstantString("bundle identifier"); }
+HostStringRef HostGetBundleVersionKey() { return HostGetConstantString("bundle version"); }
+HostStringRef HostGetSerialNumberKey() { return HostGetConstantString("serial number"); }
 
 HostStringRef HostCreateStringFromUTF8(const char* bytes) {
   if (bytes == nullptr || !text::isUTF8(bytes)) return nullptr;

@@ -12,6 +12,12 @@ Dictionary::~Dictionary() {
   for (const auto& [key, value] : entries) HostRelease(value);
 }
 
+const std::string& textOf(HostStringRef string) {
+  static const std::string empty;
+  const auto* found = as<String>(string);
+  return found != nullptr ? found->text : empty;
+}
+
 }  // namespace base
 
 using base::as;
@@ -33,10 +39,6 @@ HostObject* HostDictionaryGetValue(HostDictionaryRef dictionary, HostStringRef k
       std::ranges::find(found->entries, wanted->text, &base::Dictionary::Entries::value_type::first);
   return entry != found->entries.end() ? entry->second : nullptr;
 }
-
-HostStringRef HostGetBundleIdentifierKey() { return HostGetConstantString("bundle identifier"); }
-HostStringRef HostGetBundleVersionKey() { return HostGetConstantString("bundle version"); }
-HostStringRef HostGetSerialNumberKey() { return HostGetConstantString("serial number"); }
 
 HostSerialNumberRef HostAsSerialNumber(HostObject* object) {
   return HostSerialNumberRef(as<base::SerialNumber>(object));
