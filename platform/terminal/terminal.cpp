@@ -13,8 +13,8 @@
 #include <cstdio>
 #include <cstring>
 #include <cwctype>
-#include <initializer_list>
 
+#include "platform/base/signal_set.h"
 #include "platform/terminal/rescue.h"
 
 namespace terminal {
@@ -34,15 +34,8 @@ void chooseLocale() {
   }
 }
 
-sigset_t setOf(std::initializer_list<int> signals) {
-  sigset_t set;
-  sigemptyset(&set);
-  for (const int signal : signals) sigaddset(&set, signal);
-  return set;
-}
-
 sigset_t terminalSignals() {
-  sigset_t signals = setOf({SIGWINCH, SIGCONT, SIGHUP, SIGQUIT});
+  sigset_t signals = base::signalSet({SIGWINCH, SIGCONT, SIGHUP, SIGQUIT});
   struct sigaction stop {};
   sigaction(SIGTSTP, nullptr, &stop);
   // Without job control the shell has it ignored, and nobody would continue what stopped.
@@ -188,7 +181,7 @@ void Terminal::takeSize() {
 void Terminal::stop() {
   termios current{};
   tcgetattr(STDIN_FILENO, &current);
-  const sigset_t writing = setOf({SIGTTOU});
+  const sigset_t writing = base::signalSet({SIGTTOU});
   sigprocmask(SIG_BLOCK, &writing, nullptr);
   leaveScreen();
   // Where a parent stopped first the shell may have the terminal already, in the modes of its own line.
@@ -197,7 +190,7 @@ void Terminal::stop() {
 
   std::signal(SIGTSTP, SIG_DFL);
   raise(SIGTSTP);
-  const sigset_t stopping = setOf({SIGTSTP});
+  const sigset_t stopping = base::signalSet({SIGTSTP});
   sigprocmask(SIG_UNBLOCK, &stopping, nullptr);
   sigprocmask(SIG_BLOCK, &stopping, nullptr);
   comeBack();
