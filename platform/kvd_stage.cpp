@@ -5,10 +5,10 @@
 #include <optional>
 #include <string_view>
 
-#include "platform/screen/screen.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/live.h"
 #include "platform/stage/transcript.h"
+#include "platform/terminal/screen.h"
 
 namespace {
 
@@ -27,7 +27,7 @@ constexpr char kHelp[] =
 
 /// On a full screen where the terminal can show one, else line by line.
 int playAtTerminal() {
-  const std::optional<int> shown = live::play();
+  const std::optional<int> shown = terminal::play();
   const int status = shown ? *shown : stage::playConsole(std::cout);
   if (status != 0) {
     std::fputs("kvd-stage: kvd could not start; does another one run?\n", stderr);

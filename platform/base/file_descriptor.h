@@ -1,6 +1,7 @@
 // Descriptors with an owner.
 #pragma once
 
+#include <string_view>
 #include <utility>
 
 namespace base {
@@ -31,5 +32,8 @@ struct Pipe {
 
 /// A pipe, closed on exec; without ends when there are no descriptors left.
 Pipe makePipe();
+
+/// Writes all of it, waiting where it must. False, with errno set, when that fails.
+bool writeAll(const FileDescriptor& file, std::string_view bytes);
 
 }  // namespace base

@@ -6,6 +6,7 @@
 #include <limits>
 
 #include "platform/base/run_loop.h"
+#include "platform/base/signal_set.h"
 
 namespace base {
 namespace {
@@ -27,10 +28,7 @@ void endLoopOnSignals() {
   static bool installed = false;
   if (installed) return;
   std::signal(SIGPIPE, SIG_IGN);
-  sigset_t ending;
-  sigemptyset(&ending);
-  sigaddset(&ending, SIGTERM);
-  sigaddset(&ending, SIGINT);
+  const sigset_t ending = signalSet({SIGTERM, SIGINT});
   const int signals = signalfd(-1, &ending, SFD_CLOEXEC | SFD_NONBLOCK);
   // Without the descriptor the signals keep their default action, which ends the process too.
   if (signals < 0) return;

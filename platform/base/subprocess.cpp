@@ -15,6 +15,7 @@
 #include <utility>
 
 #include "platform/base/file_descriptor.h"
+#include "platform/base/signal_set.h"
 
 namespace base {
 namespace {
@@ -22,12 +23,7 @@ namespace {
 /// A file in memory, to be read from its beginning; none when it cannot be had.
 FileDescriptor fileWith(std::string_view text) {
   FileDescriptor file(memfd_create("input", MFD_CLOEXEC));
-  while (file && !text.empty()) {
-    const ssize_t count = write(file.get(), text.data(), text.size());
-    if (count <= 0) return FileDescriptor();
-    text.remove_prefix(static_cast<std::size_t>(count));
-  }
-  if (file) lseek(file.get(), 0, SEEK_SET);
+  if (!file || !writeAll(file, text) || lseek(file.get(), 0, SEEK_SET) != 0) return FileDescriptor();
   return file;
 }
 
@@ -45,11 +41,8 @@ pid_t start(Subprocess& program, const FileDescriptor& input, const FileDescript
     posix_spawn_file_actions_addopen(&files, STDERR_FILENO, "/dev/null", O_WRONLY, 0);
 
   // A child inherits what is blocked and what is ignored.
-  sigset_t none;
-  sigset_t pipes;
-  sigemptyset(&none);
-  sigemptyset(&pipes);
-  sigaddset(&pipes, SIGPIPE);
+  const sigset_t none = signalSet({});
+  const sigset_t pipes = signalSet({SIGPIPE});
   posix_spawnattr_t attributes;
   posix_spawnattr_init(&attributes);
   posix_spawnattr_setsigmask(&attributes, &none);

@@ -6,8 +6,9 @@
 
 #include <algorithm>
 #include <csignal>
-#include <initializer_list>
 #include <utility>
+
+#include "platform/base/signal_set.h"
 
 namespace stage {
 
@@ -21,18 +22,11 @@ std::function<bool()> sSleepListener;
 constexpr Nanoseconds kSlice = kSecond / 4;
 Slept sSlept;
 
-sigset_t setOf(std::initializer_list<int> signals) {
-  sigset_t set;
-  sigemptyset(&set);
-  for (const int signal : signals) sigaddset(&set, signal);
-  return set;
-}
-
 /// A descriptor that polls as readable while one of these signals is pending, being blocked. Nobody reads it:
 /// the run loop and the terminal take signals from descriptors of their own.
 int pendingSignals() {
   static const int descriptor = [] {
-    const sigset_t awaited = setOf({SIGTERM, SIGINT, SIGHUP, SIGQUIT, SIGTSTP, SIGWINCH});
+    const sigset_t awaited = base::signalSet({SIGTERM, SIGINT, SIGHUP, SIGQUIT, SIGTSTP, SIGWINCH});
     return signalfd(-1, &awaited, SFD_CLOEXEC | SFD_NONBLOCK);
   }();
   return descriptor;

@@ -44,15 +44,6 @@ void wait(const LiveView& view, std::optional<Nanoseconds> deadline) {
   if (waitEnd() && *waitEnd() <= now()) finishWait();
 }
 
-bool writeAll(const base::FileDescriptor& file, std::string_view text) {
-  while (!text.empty()) {
-    const ssize_t count = write(file.get(), text.data(), text.size());
-    if (count < 0) return false;
-    text.remove_prefix(static_cast<std::size_t>(count));
-  }
-  return true;
-}
-
 }  // namespace
 
 int playLive(const LiveView& view) {
@@ -87,7 +78,7 @@ void saveRehearsal(const std::string& path) {
   const base::FileDescriptor file(open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666));
   if (!file) throw remote::UsageError("cannot save to " + path + ": " + std::strerror(errno));
   const std::optional<std::string> transcript = playAgain(commands);
-  if (!transcript || !writeAll(file, *transcript)) {
+  if (!transcript || !base::writeAll(file, *transcript)) {
     const int error = errno;
     unlink(path.c_str());
     throw remote::UsageError("cannot save to " + path + ": " +

@@ -6,6 +6,8 @@
 #include <cerrno>
 #include <csignal>
 
+#include "platform/base/signal_set.h"
+
 namespace {
 
 using namespace std::chrono_literals;
@@ -53,10 +55,8 @@ TEST(Subprocess, WhatDoesNotEndByItselfLeavesNothing) {
 }
 
 TEST(Subprocess, TheRunLoopsSignalsAreNotInherited) {
-  sigset_t ending;
+  const sigset_t ending = base::signalSet({SIGTERM});
   sigset_t before;
-  sigemptyset(&ending);
-  sigaddset(&ending, SIGTERM);
   sigprocmask(SIG_BLOCK, &ending, &before);
   const auto previous = std::signal(SIGPIPE, SIG_IGN);
   for (const std::string signal : {"TERM", "PIPE"}) {
