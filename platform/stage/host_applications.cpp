@@ -4,6 +4,7 @@
 #include <string>
 #include <vector>
 
+#include "platform/base/application_information.h"
 #include "platform/base/values.h"
 #include "platform/host.h"
 #include "platform/stage/desktop.h"
@@ -16,31 +17,8 @@ using stage::Question;
 using stage::record;
 using stage::recordQuestion;
 
-HostObject* copySerialNumber(const HostProcessSerialNumber& process) {
-  return new base::SerialNumber(process);
-}
-
-/// One value of a process's information, owned; null for an unknown key.
-HostObject* copyInformation(const stage::Process& process, HostStringRef key) {
-  if (HostStringsAreEqual(key, HostGetBundleIdentifierKey())) {
-    return new base::String(process.application->identifier);
-  }
-  if (HostStringsAreEqual(key, HostGetBundleVersionKey())) {
-    return process.application->version.empty() ? nullptr : new base::String(process.application->version);
-  }
-  if (HostStringsAreEqual(key, HostGetSerialNumberKey())) return copySerialNumber(process.serialNumber);
-  return nullptr;
-}
-
-bool matches(const stage::Process& process, std::size_t count, const HostStringRef* keys,
-             HostObject* const* values) {
-  for (std::size_t i = 0; i < count; ++i) {
-    HostObject* const actual = copyInformation(process, keys[i]);
-    const bool equal = HostStringsAreEqual(HostAsString(actual), HostAsString(values[i]));
-    HostRelease(actual);
-    if (!equal) return false;
-  }
-  return true;
+base::ApplicationInstance instanceOf(const stage::Process& process) {
+  return {process.serialNumber, process.application->identifier, process.application->version};
 }
 
 const stage::Process* processOf(HostSessionID session, HostSerialNumberRef serialNumber) {
@@ -60,9 +38,9 @@ HostListRef HostFindRunningApplications(HostSessionID session, std::size_t count
   if (session != kHostDefaultSession) return nullptr;
   std::vector<HostObject*> found;
   for (const stage::Process& process : stage::desktop().running) {
-    if (!matches(process, count, keys, values)) continue;
+    if (!base::hasInformation(instanceOf(process), count, keys, values)) continue;
     if (found.empty()) record(Entry::Question, "finds " + process.application->name + " running");
-    found.push_back(copySerialNumber(process.serialNumber));
+    found.push_back(new base::SerialNumber(process.serialNumber));
   }
   return HostListRef(new base::List(std::move(found)));
 }
@@ -70,11 +48,7 @@ HostListRef HostFindRunningApplications(HostSessionID session, std::size_t count
 HostDictionaryRef HostCopyApplicationInformation(HostSessionID session, HostSerialNumberRef serialNumber,
                                                  HostStringRef key) {
   const stage::Process* const process = processOf(session, serialNumber);
-  if (process == nullptr) return nullptr;
-  HostObject* const value = copyInformation(*process, key);
-  base::Dictionary::Entries entries;
-  if (value != nullptr) entries.emplace_back(base::textOf(key), value);
-  return HostDictionaryRef(new base::Dictionary(std::move(entries)));
+  return process != nullptr ? base::copyInformation(instanceOf(*process), key) : nullptr;
 }
 
 HostObject* HostCopyApplicationInformationItem(HostSessionID session, HostSerialNumberRef serialNumber,
@@ -86,7 +60,7 @@ HostObject* HostCopyApplicationInformationItem(HostSessionID session, HostSerial
   }
   recordQuestion(Question::WhoRuns, "asks whether " + process->application->name + " runs: yes",
                  process->application);
-  return copyInformation(*process, key);
+  return base::copyInformationItem(instanceOf(*process), key);
 }
 
 HostSerialNumberRef HostCopyFrontApplication(HostSessionID session) {
@@ -95,5 +69,5 @@ HostSerialNumberRef HostCopyFrontApplication(HostSessionID session) {
   recordQuestion(Question::WhoIsInFront,
                  "asks who is in front: " + (front ? front->application->name : std::string("nobody")),
                  front ? front->application : nullptr);
-  return front ? HostSerialNumberRef(copySerialNumber(front->serialNumber)) : nullptr;
+  return front ? HostSerialNumberRef(new base::SerialNumber(front->serialNumber)) : nullptr;
 }

@@ -3,6 +3,7 @@
 #include <string>
 #include <vector>
 
+#include "platform/base/application_information.h"
 #include "platform/base/values.h"
 #include "platform/host.h"
 #include "platform/linux/programs/running.h"
@@ -25,27 +26,9 @@ constexpr std::int32_t kNoSuchProcess = -600;
 constexpr std::int32_t kBadEvent = -50;
 constexpr std::int32_t kNotUnderstood = -1708;
 
-/// One value of a program's information, owned; null for an unknown key.
-HostObject* copyInformation(const Instance& instance, HostStringRef key) {
-  if (HostStringsAreEqual(key, HostGetBundleIdentifierKey())) {
-    return new base::String(programs::bundleIdentifier(instance.role));
-  }
-  if (HostStringsAreEqual(key, HostGetBundleVersionKey())) {
-    return instance.role == Role::PhotoLibrary ? new base::String(kPhotoLibraryVersion) : nullptr;
-  }
-  if (HostStringsAreEqual(key, HostGetSerialNumberKey())) {
-    return new base::SerialNumber(instance.serialNumber);
-  }
-  return nullptr;
-}
-
-bool matches(const Instance& instance, std::size_t count, const HostStringRef* keys,
-             HostObject* const* values) {
-  for (std::size_t i = 0; i < count; ++i) {
-    const base::Owned<HostObject> actual(copyInformation(instance, keys[i]));
-    if (!HostStringsAreEqual(HostAsString(actual.get()), HostAsString(values[i]))) return false;
-  }
-  return true;
+base::ApplicationInstance informationOf(const Instance& instance) {
+  return {instance.serialNumber, programs::bundleIdentifier(instance.role),
+          instance.role == Role::PhotoLibrary ? kPhotoLibraryVersion : ""};
 }
 
 /// As the list stands: a button asks about every program several times, and has asked for the seed before.
@@ -71,7 +54,7 @@ HostListRef HostFindRunningApplications(HostSessionID session, std::size_t count
   // Role by role, so that the instances of each come in their own order.
   for (const Role role : programs::kRoles) {
     for (const Instance* instance : programs::rankedInstances(role)) {
-      if (matches(*instance, count, keys, values)) {
+      if (base::hasInformation(informationOf(*instance), count, keys, values)) {
         found.push_back(new base::SerialNumber(instance->serialNumber));
       }
     }
@@ -82,17 +65,13 @@ HostListRef HostFindRunningApplications(HostSessionID session, std::size_t count
 HostDictionaryRef HostCopyApplicationInformation(HostSessionID session, HostSerialNumberRef serialNumber,
                                                  HostStringRef key) {
   const Instance* const instance = instanceOf(session, serialNumber);
-  if (instance == nullptr) return nullptr;
-  HostObject* const value = copyInformation(*instance, key);
-  base::Dictionary::Entries entries;
-  if (value != nullptr) entries.emplace_back(base::textOf(key), value);
-  return HostDictionaryRef(new base::Dictionary(std::move(entries)));
+  return instance != nullptr ? base::copyInformation(informationOf(*instance), key) : nullptr;
 }
 
 HostObject* HostCopyApplicationInformationItem(HostSessionID session, HostSerialNumberRef serialNumber,
                                                HostStringRef key) {
   const Instance* const instance = instanceOf(session, serialNumber);
-  return instance != nullptr ? copyInformation(*instance, key) : nullptr;
+  return instance != nullptr ? base::copyInformationItem(informationOf(*instance), key) : nullptr;
 }
 
 HostSerialNumberRef HostCopyFrontApplication(HostSessionID session) {
