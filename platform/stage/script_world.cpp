@@ -1,6 +1,5 @@
 #include "platform/stage/script_world.h"
 
-#include <cstdio>
 #include <map>
 #include <memory>
 
@@ -9,6 +8,7 @@
 #include "platform/stage/desktop.h"
 #include "platform/stage/four_char_code.h"
 #include "platform/stage/journal.h"
+#include "platform/stage/quantities.h"
 
 namespace stage {
 
@@ -63,11 +63,7 @@ struct Describe {
   std::string operator()(std::monostate) const { return {}; }
   std::string operator()(bool value) const { return value ? "true" : "false"; }
   std::string operator()(std::int64_t value) const { return std::to_string(value); }
-  std::string operator()(double value) const {
-    char text[32];
-    std::snprintf(text, sizeof text, "%g", value);
-    return text;
-  }
+  std::string operator()(double value) const { return numberText(value); }
   std::string operator()(const std::string& value) const { return '"' + value + '"'; }
   std::string operator()(tarnscript::Constant value) const { return quoted(value.code); }
   std::string operator()(const tarnscript::ObjectRef& value) const {
