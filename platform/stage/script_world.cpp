@@ -1,8 +1,5 @@
 #include "platform/stage/script_world.h"
 
-#include <map>
-#include <memory>
-
 #include "platform/scripting/additions_dictionary.h"
 #include "platform/scripting/script.h"
 #include "platform/stage/desktop.h"
@@ -30,16 +27,12 @@ class Additions final : public Application {
 
 Value Additions::obey(const tarnscript::Event& event) {
   if (event.command == words::kGetVolumeSettings) {
-    return std::make_shared<const std::map<tarnscript::Code, Value>>(std::map<tarnscript::Code, Value>{
-        {words::kOutputVolume, std::int64_t{desktop().outputVolume}},
-        {words::kOutputMuted, desktop().outputMuted},
-    });
+    return words::volumeSettings(desktop().outputVolume, desktop().outputMuted);
   }
   if (event.command != words::kSetVolume) return Application::obey(event);
-  const auto volume = event.parameters.find(words::kOutputVolume);
-  if (volume != event.parameters.end()) setOutputVolume(tarnscript::toInt32(volume->second));
-  const auto muted = event.parameters.find(words::kOutputMuted);
-  if (muted != event.parameters.end()) setOutputMuted(tarnscript::toInt32(muted->second) != 0);
+  const auto [volume, muted] = words::volumeChange(event);
+  if (volume) setOutputVolume(*volume);
+  if (muted) setOutputMuted(*muted);
   return {};
 }
 
