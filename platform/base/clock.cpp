@@ -15,16 +15,8 @@
 namespace base {
 namespace {
 
-constexpr Nanoseconds kSecond = 1'000'000'000;
-
 timespec toTimespec(Nanoseconds time) {
   return {.tv_sec = time / kSecond, .tv_nsec = static_cast<long>(time % kSecond)};
-}
-
-Nanoseconds bootTime() {
-  timespec now{};
-  clock_gettime(CLOCK_BOOTTIME, &now);
-  return now.tv_sec * kSecond + now.tv_nsec;
 }
 
 void sleepOnBootTime(Nanoseconds duration) {
@@ -66,6 +58,12 @@ TimeSource& current() {
 }
 
 }  // namespace
+
+Nanoseconds bootTime() {
+  timespec now{};
+  clock_gettime(CLOCK_BOOTTIME, &now);
+  return now.tv_sec * kSecond + now.tv_nsec;
+}
 
 void waitForSources(std::optional<Nanoseconds> deadline) {
   static Alarm alarm;

@@ -5,6 +5,9 @@
 
 namespace base {
 
+/// CLOCK_BOOTTIME, whatever time source is in force.
+Nanoseconds bootTime();
+
 /// The time source in force; every member is set.
 const TimeSource& timeSource();
 

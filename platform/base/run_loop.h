@@ -19,6 +19,7 @@ namespace base {
 
 /// Nanoseconds on the clock of HostAbsoluteTime.
 using Nanoseconds = std::int64_t;
+inline constexpr Nanoseconds kSecond = 1'000'000'000;
 
 /// The loop's idea of time; the default, for each member that is empty too, is CLOCK_BOOTTIME.
 struct TimeSource {

@@ -1,5 +1,8 @@
 #include "platform/scripting/additions_dictionary.h"
 
+#include <map>
+#include <memory>
+
 namespace scripting::additions {
 
 namespace {
@@ -27,5 +30,19 @@ constexpr tarnscript::Dictionary kDictionary{{}, kProperties, kCommands, kParame
 }  // namespace
 
 const tarnscript::Dictionary& dictionary() { return kDictionary; }
+
+Value volumeSettings(std::int64_t volume, bool muted) {
+  return std::make_shared<const std::map<Code, Value>>(
+      std::map<Code, Value>{{kOutputVolume, volume}, {kOutputMuted, muted}});
+}
+
+VolumeChange volumeChange(const tarnscript::Event& event) {
+  VolumeChange change;
+  const auto volume = event.parameters.find(kOutputVolume);
+  if (volume != event.parameters.end()) change.volume = tarnscript::toInt32(volume->second);
+  const auto muted = event.parameters.find(kOutputMuted);
+  if (muted != event.parameters.end()) change.muted = tarnscript::toInt32(muted->second) != 0;
+  return change;
+}
 
 }  // namespace scripting::additions

@@ -8,6 +8,7 @@
 #include <csignal>
 #include <utility>
 
+#include "platform/base/clock.h"
 #include "platform/base/signal_set.h"
 
 namespace stage {
@@ -59,12 +60,7 @@ void useVirtualTime() { sVirtual = true; }
 
 bool timeIsVirtual() { return sVirtual; }
 
-Nanoseconds now() {
-  if (sVirtual) return sNow;
-  timespec time{};
-  clock_gettime(CLOCK_BOOTTIME, &time);
-  return time.tv_sec * kSecond + time.tv_nsec;
-}
+Nanoseconds now() { return sVirtual ? sNow : base::bootTime(); }
 
 void advanceTo(Nanoseconds time) { sNow = std::max(sNow, time); }
 

@@ -7,9 +7,8 @@
 
 namespace stage {
 
+using base::kSecond;
 using base::Nanoseconds;
-
-inline constexpr Nanoseconds kSecond = 1'000'000'000;
 
 /// Where virtual time begins: a multiple of 600 s, so that the idle check falls on round times, and not zero,
 /// so that a date of zero is long past as it is on a real machine.

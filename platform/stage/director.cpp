@@ -4,7 +4,7 @@
 
 #include "daemon/lifecycle.h"
 #include "platform/stage/commands.h"
-#include "platform/stage/fold.h"
+#include "platform/stage/quantities.h"
 
 namespace stage {
 

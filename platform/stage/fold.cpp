@@ -1,7 +1,8 @@
 #include "platform/stage/fold.h"
 
-#include <cstdio>
 #include <utility>
+
+#include "platform/stage/quantities.h"
 
 namespace stage {
 
@@ -47,21 +48,6 @@ void Fold::write(std::ostream& output) {
     writeContent(output, item, kIndent);
   }
   items_.clear();
-}
-
-std::string timeText(Nanoseconds duration) {
-  const Nanoseconds hours = duration / (3600 * kSecond);
-  const Nanoseconds minutes = duration / (60 * kSecond) % 60;
-  const double seconds = static_cast<double>(duration % (60 * kSecond)) / static_cast<double>(kSecond);
-  std::string text;
-  if (hours > 0) text += std::to_string(hours) + "h";
-  if (minutes > 0) text += std::to_string(minutes) + "m";
-  if (seconds > 0 || text.empty()) {
-    char digits[32];
-    std::snprintf(digits, sizeof digits, "%.10gs", seconds);
-    text += digits;
-  }
-  return text;
 }
 
 }  // namespace stage

@@ -36,7 +36,4 @@ class Fold {
   std::deque<Item> items_;
 };
 
-/// A length of time for people: "0.05s", "1.05s", "10m", "2h10m".
-std::string timeText(Nanoseconds duration);
-
 }  // namespace stage

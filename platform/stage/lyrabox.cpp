@@ -4,6 +4,7 @@
 #include <iterator>
 
 #include "platform/scripting/lyrabox_dictionary.h"
+#include "platform/stage/quantities.h"
 
 namespace stage {
 

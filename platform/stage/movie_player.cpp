@@ -2,10 +2,10 @@
 
 #include <algorithm>
 #include <cmath>
-#include <cstdio>
 #include <utility>
 
 #include "platform/scripting/movie_dictionaries.h"
+#include "platform/stage/quantities.h"
 
 namespace stage {
 
@@ -16,12 +16,6 @@ using tarnscript::ObjectRef;
 using tarnscript::Value;
 
 constexpr Nanoseconds kFrame = kSecond / 25;
-
-std::string numberText(double number) {
-  char text[32];
-  std::snprintf(text, sizeof text, "%g", number);
-  return text;
-}
 
 double numberOf(const Value& value) {
   if (const auto* real = std::get_if<double>(&value)) return *real;

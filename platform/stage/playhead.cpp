@@ -32,10 +32,4 @@ double inSeconds(Nanoseconds position) {
   return static_cast<double>(position) / static_cast<double>(kSecond);
 }
 
-std::string positionText(Nanoseconds position) {
-  const Nanoseconds seconds = position / kSecond;
-  const std::string rest = std::to_string(seconds % 60);
-  return std::to_string(seconds / 60) + (rest.size() < 2 ? ":0" : ":") + rest;
-}
-
 }  // namespace stage

@@ -2,7 +2,6 @@
 #pragma once
 
 #include <optional>
-#include <string>
 
 #include "platform/stage/clock.h"
 
@@ -35,8 +34,5 @@ class Playhead {
 
 /// A position as scripts speak of it.
 double inSeconds(Nanoseconds position);
-
-/// A position for people: minutes and seconds, "3:05".
-std::string positionText(Nanoseconds position);
 
 }  // namespace stage

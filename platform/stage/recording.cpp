@@ -3,7 +3,7 @@
 #include <string_view>
 #include <utility>
 
-#include "platform/stage/fold.h"
+#include "platform/stage/quantities.h"
 
 namespace stage {
 

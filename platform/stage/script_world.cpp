@@ -1,14 +1,11 @@
 #include "platform/stage/script_world.h"
 
-#include <cstdio>
-#include <map>
-#include <memory>
-
 #include "platform/scripting/additions_dictionary.h"
 #include "platform/scripting/script.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/four_char_code.h"
 #include "platform/stage/journal.h"
+#include "platform/stage/quantities.h"
 
 namespace stage {
 
@@ -30,16 +27,12 @@ class Additions final : public Application {
 
 Value Additions::obey(const tarnscript::Event& event) {
   if (event.command == words::kGetVolumeSettings) {
-    return std::make_shared<const std::map<tarnscript::Code, Value>>(std::map<tarnscript::Code, Value>{
-        {words::kOutputVolume, std::int64_t{desktop().outputVolume}},
-        {words::kOutputMuted, desktop().outputMuted},
-    });
+    return words::volumeSettings(desktop().outputVolume, desktop().outputMuted);
   }
   if (event.command != words::kSetVolume) return Application::obey(event);
-  const auto volume = event.parameters.find(words::kOutputVolume);
-  if (volume != event.parameters.end()) setOutputVolume(tarnscript::toInt32(volume->second));
-  const auto muted = event.parameters.find(words::kOutputMuted);
-  if (muted != event.parameters.end()) setOutputMuted(tarnscript::toInt32(muted->second) != 0);
+  const auto [volume, muted] = words::volumeChange(event);
+  if (volume) setOutputVolume(*volume);
+  if (muted) setOutputMuted(*muted);
   return {};
 }
 
@@ -63,11 +56,7 @@ struct Describe {
   std::string operator()(std::monostate) const { return {}; }
   std::string operator()(bool value) const { return value ? "true" : "false"; }
   std::string operator()(std::int64_t value) const { return std::to_string(value); }
-  std::string operator()(double value) const {
-    char text[32];
-    std::snprintf(text, sizeof text, "%g", value);
-    return text;
-  }
+  std::string operator()(double value) const { return numberText(value); }
   std::string operator()(const std::string& value) const { return '"' + value + '"'; }
   std::string operator()(tarnscript::Constant value) const { return quoted(value.code); }
   std::string operator()(const tarnscript::ObjectRef& value) const {

@@ -5,6 +5,7 @@
 #include <iterator>
 
 #include "platform/scripting/spindle_dictionary.h"
+#include "platform/stage/quantities.h"
 
 namespace stage {
 

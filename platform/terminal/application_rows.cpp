@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <numeric>
 
-#include "platform/stage/fold.h"
+#include "platform/stage/quantities.h"
 #include "platform/terminal/catalogue.h"
 #include "platform/terminal/text.h"
 

@@ -1,8 +1,5 @@
 #include "platform/linux/roles/additions.h"
 
-#include <map>
-#include <memory>
-
 #include "platform/linux/sound/sound.h"
 #include "platform/scripting/additions_dictionary.h"
 
@@ -39,23 +36,18 @@ class Additions final : public tarnscript::Application {
 Value volumeSettings() {
   const auto state = sound::soundState();
   require(state.has_value());
-  return std::make_shared<const std::map<Code, Value>>(std::map<Code, Value>{
-      {words::kOutputVolume, std::int64_t{state->volume}},
-      {words::kOutputMuted, state->muted},
-  });
+  return words::volumeSettings(state->volume, state->muted);
 }
 
-void setVolume(const std::map<Code, Value>& parameters) {
-  const auto volume = parameters.find(words::kOutputVolume);
-  if (volume != parameters.end()) require(sound::setOutputVolume(tarnscript::toInt32(volume->second)));
-  const auto muted = parameters.find(words::kOutputMuted);
-  if (muted != parameters.end()) require(sound::setOutputMuted(tarnscript::toInt32(muted->second) != 0));
+void setVolume(const words::VolumeChange& change) {
+  if (change.volume) require(sound::setOutputVolume(*change.volume));
+  if (change.muted) require(sound::setOutputMuted(*change.muted));
 }
 
 Value Additions::perform(const tarnscript::Event& event) {
   if (event.command == words::kGetVolumeSettings) return volumeSettings();
   if (event.command != words::kSetVolume) refuse();
-  setVolume(event.parameters);
+  setVolume(words::volumeChange(event));
   return {};
 }
 
