@@ -31,7 +31,7 @@ double rateOf(Player& player) {
 }
 
 void playAtRate(Player& player, const PlayerState& state, double rate) {
-  if (rate == 1 && player.ownRate) return start(player);
+  if (rate == 1 && (player.ownRate || scanRate(player))) return start(player);
   if (!takesRate(player, state, rate)) {
     if (rate == 1) return start(player);
     endFastPlaying(player);

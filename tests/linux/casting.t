@@ -1,0 +1,54 @@
+# Who plays which role: what a person wrote into the desktop entry, else the table, else the entry's categories.
+entry mpv X-Kvd-Application=com.tarn.Lyrabox
+entry vlc X-Kvd-Application=none
+entry firefox Categories=Network;WebBrowser; X-Kvd-Application=com.tarn.VistremePlayerX
+entry newcomer Categories=AudioVideo;Audio;Player;
+entry organiser Categories=Graphics;Photography;
+player mpv DesktopEntry=mpv
+player vlc DesktopEntry=vlc
+player firefox as=firefox.instance_1 DesktopEntry=firefox title=Film
+start
+tell Lyrabox to play
+  mpv: Play
+tell Spindle to play dvd
+  fails
+tell VistremePlayerX to play front document
+  firefox: Play
+quit mpv
+player newcomer DesktopEntry=newcomer.desktop
+tell Lyrabox to play
+  newcomer: Play
+program organiser
+window Photos of organiser class=organiser
+front Photos
+tap right
+  window Photos: key Right
+# Browsers, proxies and headsets whom nobody cast.
+quit newcomer
+player playerctld DesktopEntry=newcomer
+player chromium as=chromium.instance4711 DesktopEntry=newcomer
+player headset
+tell Lyrabox to play
+  fails
+
+# A sandboxed player speaks through a proxy, so that its window has another process: its entry tells whose it is.
+player proxy as=totem title=Film DesktopEntry=org.gnome.Totem
+program sandbox
+window Film of sandbox id=org.gnome.Totem
+front Film
+tap play
+  firefox: Pause
+  proxy: Play
+quit sandbox
+window Film of nobody id=org.gnome.Totem
+front Film
+tap play
+  proxy: Pause
+close Film
+tell VistremePlayerX to activate
+  proxy: Raise
+# A player with two names stays while it has one of them.
+player rhythmbox owns=org.mpris.MediaPlayer2.rhythmbox.instance7
+rhythmbox: drops=org.mpris.MediaPlayer2.rhythmbox
+tell Lyrabox to play
+  rhythmbox: Play

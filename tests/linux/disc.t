@@ -1,0 +1,66 @@
+# A disc in VLC, over MPRIS2 and VLC's rc interface.
+player vlc url=dvd:///dev/sr0 length=2h playing channel=rc rc.title=0/3 rc.chapter=0/12
+window Dune of vlc class=vlc
+player strawberry playing
+front Dune
+start
+# In the menu: select picks, there is nothing to scan, and one goes back to the film.
+tap select
+  strawberry: Pause
+  vlc: channel: key key-nav-activate
+press forward
+tap app-menu
+  vlc: channel: title 1
+  vlc: channel: seek 0
+# In the film: chapters. The menu comes and goes, and the film goes on where it was.
+vlc: rc.title=2/3 rc.chapter=4/12 Position=30m
+tap next
+  vlc: channel: chapter 5
+tap previous
+  vlc: channel: chapter 3
+tap app-menu
+  vlc: channel: key key-disc-menu
+vlc: rc.title=0/3
+tap app-menu
+  vlc: channel: title 2
+  vlc: channel: seek 1800
+vlc: rc.title=2/3
+# While it stands still VLC does not tell where, and takes no numbers: it is where it was.
+tap playpause
+  vlc: Pause
+tap next
+  vlc: channel: key key-chapter-next
+tap playpause
+  vlc: Play
+# Scans: by VLC's rate forward, by seeking backward; begun while it stood still they end so.
+vlc: MaximumRate=30
+press forward
+  vlc: Set Rate 8
+release forward
+  vlc: Set Rate 1
+tap pause
+  vlc: Pause
+press rewind
+wait 0.25s
+  +0.25s  vlc: SetPosition /track/1 1798s
+release rewind
+
+# Without rc nobody tells of a menu, nor of chapters: there are keys.
+quit vlc
+player vlc url=dvd:///dev/sr0 length=2h playing
+window Dune of vlc class=vlc
+tap next
+  window Dune: key Shift+n
+tap app-menu
+  window Dune: key Shift+m
+# A file's chapters are the play list, of which VLC says that it goes on for ever.
+vlc: url=file:///film.mkv Tracks=/track/1,/track/2
+tap next
+  vlc: Next
+vlc: track=/track/2 Position=1m
+tap next
+tap previous
+  vlc: Previous
+vlc: track=/track/1
+tap previous
+  vlc: SetPosition /track/1 0s

@@ -1,0 +1,75 @@
+# Films: faster by the player's own rate, scanned by seeking where it has none, stepped frame by frame.
+player mpv title=Dune length=2h MaximumRate=100 playing
+window Dune of mpv class=mpv
+start
+
+# A person watches at 1.5 times the speed, and does so again after a scan. What stood still stands still again.
+mpv: Rate=1.5 Position=1m
+press forward
+  mpv: Set Rate 2
+release forward
+  mpv: Set Rate 1.5
+press rewind
+wait 0.25s
+  +0.25s  mpv: SetPosition /track/1 59.5s
+release rewind
+tap pause
+  mpv: Pause
+press forward
+  mpv: Set Rate 2
+  mpv: Play
+release forward
+  mpv: Pause
+  mpv: Set Rate 1.5
+# A rate that somebody else left behind is none at which people watch.
+mpv: Rate=4 playing
+press forward
+  mpv: Set Rate 2
+release forward
+  mpv: Set Rate 1
+
+# A step is one frame, over mpv's channel, else by its key.
+tap next
+  window Dune: key .
+mpv: channel=mpv-socket
+tap next
+  mpv: channel: frame-step
+mpv: refuses=frame-step
+tell VistremePlayer to step forward front movie
+  mpv: channel: frame-step
+  fails
+# Another program takes the channel's path over: nothing that is meant for mpv goes there.
+mpv: obeys=frame-step
+program thief channel=mpv-socket
+tap next
+mpv: channel=other-socket
+tap next
+  mpv: channel: frame-step
+tell VistremePlayer to activate
+  window Dune: activate
+quit mpv
+
+# The modern movie player climbs through its rates, and answers on the screen: in a notification that takes the
+# place of the one before, or in its own picture.
+player celluloid as=io.github.celluloid_player.Celluloid.instance-1 length=2h MaximumRate=8 playing
+celluloid: url=file:///films/dune%201.mkv
+program desk owns=org.freedesktop.Notifications
+tap forward
+  desk: Notify kvd 0 io.github.celluloid_player.Celluloid dune 1.mkv 0:00 / 2:00:00 2000
+  celluloid: Set Rate 2
+tap forward
+  desk: Notify kvd 7 io.github.celluloid_player.Celluloid dune 1.mkv 0:00 / 2:00:00 2000
+  celluloid: Set Rate 4
+celluloid: channel=mpv-socket Position=1h3m5s
+tap rewind
+  celluloid: channel: show-text dune 1.mkv|1:03:05 / 2:00:00
+  celluloid: Set Rate 2
+tap rewind
+  celluloid: channel: show-text dune 1.mkv|1:03:05 / 2:00:00
+  celluloid: Set Rate 1
+tap rewind
+  celluloid: channel: show-text dune 1.mkv|1:03:05 / 2:00:00
+wait 0.25s
+  +0.25s  celluloid: SetPosition /track/1 3784.5s
+tap playpause
+  celluloid: channel: show-text dune 1.mkv|1:03:04 / 2:00:00

@@ -1,0 +1,82 @@
+# What players do otherwise than they should.
+
+# One that toggles is told only what it does not do yet, whoever else has told it something.
+player celluloid as=io.github.celluloid_player.Celluloid.instance-1 toggles title=Dune
+start
+tap play
+  celluloid: Play
+celluloid: paused
+tap pause
+tap play
+  celluloid: Play
+quit celluloid
+
+# One that announces nothing is asked; one that takes its time is believed for half a second to do as it was told,
+# whatever it announces meanwhile.
+player audacious silent
+tap play
+  audacious: Play
+audacious: paused
+wait 0.4s
+tell Lyrabox to get player state
+  = 'kPSP'
+wait 0.1s
+tell Lyrabox to get player state
+  = 'kPSU'
+quit audacious
+player strawberry playing ignores=Pause
+tap play
+  strawberry: Pause
+strawberry: playing
+tell Lyrabox to get player state
+  = 'kPSU'
+wait 0.5s
+tell Lyrabox to get player state
+  = 'kPSP'
+
+# One that refuses, and one that dies of it.
+strawberry: paused refuses=Play
+tell Lyrabox to play
+  strawberry: Play
+  fails
+tell Lyrabox to get player state
+  = 'kPSU'
+strawberry: dies=Play
+tell Lyrabox to play
+  strawberry: Play
+  strawberry: gone
+  fails
+tell Lyrabox to play
+  fails
+
+# A track id that is none is not sent back: the bus would throw kvd out.
+player vlc url=file:///film.mkv length=1h Position=10m CanGoPrevious=false track:s= playing
+tap previous
+  vlc: Seek -600s
+vlc: track:s=42 Position=10m
+tap previous
+  vlc: Seek -600s
+vlc: track=/org/mpris/MediaPlayer2/TrackList/NoTrack Position=10m
+tap previous
+  vlc: Seek -600s
+# Times and volumes that are no numbers, numbers that are none, values of other types.
+vlc: Position:s=soon Volume:d=inf
+tell Spindle to get elapsed time
+  = 0
+tell Spindle to get audio volume
+  = 255
+vlc: Position:d=nan Volume:d=-3
+tell Spindle to get elapsed time
+  = 0
+tell Spindle to get audio volume
+  = 255
+vlc: Position:d=1e300
+tell Spindle to get elapsed time
+  = 0
+vlc: PlaybackStatus:d=1
+wait 1s
+tell Spindle to get dvd state
+  = 'esps'
+vlc: Metadata:s=none
+tell Spindle to get has media
+  = 0

@@ -1,0 +1,60 @@
+# Photos: by actions where the program has them.
+program eog win.view-slideshow=false
+window Cat of eog class=Eog
+front Cat
+start
+tap play
+  window Cat: activate
+  eog: SetState win.view-slideshow true of Cat
+tap next
+  window Cat: key Right
+tap menu
+  window Cat: key Escape
+# A display is captured by a shown window that covers most of it. Then play is a key, which pauses the show.
+eog: win.view-slideshow=false
+outputs 0,0,1280,720 1280,0,1920,1080
+window Cat full-screen area=1300,0,1500,1080
+tap play
+  eog: Activate win.pause-slideshow of Cat
+window Cat area=1200,0,200,200
+tap play
+  window Cat: activate
+  eog: SetState win.view-slideshow true of Cat
+eog: win.view-slideshow=false
+window Cat hidden area=0,0,1280,720
+tap play
+  window Cat: activate
+  eog: SetState win.view-slideshow true of Cat
+quit eog
+
+# By keys to the window that a person would type into: the active one, else a full-screen one, else the topmost.
+program shotwell
+window Library of shotwell class=shotwell
+window Editor of shotwell class=shotwell
+front Library
+tap next
+  window Library: key Right
+front nobody
+tell Snapvale to select album 7
+  window Editor: key Right
+window Library full-screen
+tell Snapvale to select album 5
+  window Library: key Left
+# Where keys reach the active window alone, the others get none.
+window Library ordinary
+keys focused
+tell Snapvale to select album 5
+  fails
+front Editor
+tell Snapvale to select album 5
+  window Editor: key Left
+keys any
+quit shotwell
+# The show of a player that is stopped is its ordinary window.
+player gwenview as=Gwenview playing
+window View of gwenview class=gwenview full-screen
+tell Snapvale to get slideshow running
+  = 1
+gwenview: stopped
+tell Snapvale to get slideshow running
+  = 0

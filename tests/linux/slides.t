@@ -1,0 +1,74 @@
+# Slides. LibreOffice shows them in a window of their own; its letters are none of our business.
+program office
+window Letter of office class=libreoffice-writer
+window Talk of office class=libreoffice-impress
+player strawberry playing
+front Letter
+start
+tap play
+  strawberry: Pause
+front Talk
+strawberry: playing
+tap play
+  strawberry: Pause
+  window Talk: key F5
+window Show of office class=libreoffice-impress full-screen
+tap next
+  window Show: key Right
+press rewind
+  window Show: key Home
+# Nobody tells whether the picture is taken away: it is remembered, until a step, a jump or the end.
+tap playpause
+  window Show: key b
+tap playpause
+  window Show: key b
+tap playpause
+  window Show: key b
+tap next
+  window Show: key Right
+tap playpause
+  window Show: key b
+press forward
+  window Show: key End
+tap playpause
+  window Show: key b
+tap menu
+  window Show: key Escape ×2
+# There is no show to end; the next one begins with its picture, and one that nobody sees is none.
+close Show
+tell Slidewell to stop slideshow
+tap play
+  window Talk: key F5
+window Show of office class=libreoffice-impress full-screen
+tap playpause
+  window Show: key b
+window Show hidden
+tap play
+  window Talk: key F5
+# The window is the same, but it is a sheet now.
+close Show
+window Talk class=libreoffice-calc
+tap play
+  strawberry: Play
+
+# Evince shows in the window that it has. Full screen by its own action is no show.
+program evince win.fullscreen=false
+window Paper of evince class=evince
+front Paper
+tap play
+  strawberry: Pause
+  evince: Activate win.presentation of Paper
+window Paper full-screen
+tap next
+  window Paper: key Right
+evince: win.fullscreen=true
+tap next
+# Of several documents the active one is shown, else the topmost; a dialog is none.
+window Paper ordinary
+window Other of evince class=evince
+window Options of evince class=evince dialog
+tell Slidewell to start slideshow
+  evince: Activate win.presentation of Paper
+front nobody
+tell Slidewell to start slideshow
+  evince: Activate win.presentation of Other

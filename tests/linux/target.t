@@ -1,0 +1,69 @@
+# Who gets a button: whoever is in front, else whoever plays, else who was last chosen, else the first that runs.
+player strawberry
+player mpv title=Dune
+window Song of strawberry class=strawberry
+window Dune of mpv class=mpv
+front Dune
+strawberry: playing
+start
+tap playpause
+  strawberry: Pause
+  mpv: Play
+front nobody
+tap playpause
+  mpv: Pause
+tap playpause
+  mpv: Play
+quit mpv
+tap playpause
+  strawberry: Play
+# Pick brings it to the front.
+tap pick
+  window Song: activate
+# Where nobody can tell who is in front, nobody is.
+player mpv title=Dune
+window Dune of mpv class=mpv
+front Dune
+front unknown
+tap playpause
+  strawberry: Pause
+
+# Whoever starts silences the others first, in every role and in its own.
+player vlc playing url=file:///film.mkv
+player second as=mpv.instance2 title=Film
+window Film of second class=mpv
+strawberry: playing
+mpv: playing
+front Film
+tap play
+  strawberry: Pause
+  vlc: Pause
+  mpv: Pause
+  second: Play
+# Of two in one role the one in front comes first, else the one that plays, else the one that was started last.
+mpv: playing
+second: paused
+front nobody
+tap play
+  mpv: Pause
+front Dune
+tap play
+  mpv: Play
+mpv: paused
+front nobody
+tap play
+  second: Play
+
+# Nobody runs: play starts the default player, once; nothing is started while the screen is locked.
+quit second
+quit mpv
+quit vlc
+quit strawberry
+entry org.gnome.Music DBusActivatable=true
+program starter owns=org.gnome.Music
+lock on
+tap play
+lock off
+tap play
+  starter: Activate
+tap play
