@@ -25,8 +25,8 @@ class Failed(Exception):
     """Something that a scene expected did not come about."""
 
 
-def wait(condition, what, seconds=20):
-    """Asks until the answer is true, and returns it."""
+def wait(condition, what, seconds=60):
+    """Asks until the answer is true, and returns it. The limit is far beyond what a busy machine takes."""
     end = time.monotonic() + seconds
     while not (answer := condition()):
         if time.monotonic() > end:
@@ -35,13 +35,19 @@ def wait(condition, what, seconds=20):
     return answer
 
 
-def stays(condition, what, seconds=0.7):
-    """Asks for a while; every answer must be true."""
+def lasts(condition, seconds=0.7):
+    """Asks for a while whether every answer is true."""
     end = time.monotonic() + seconds
     while time.monotonic() < end:
         if not condition():
-            raise Failed(f"no longer so: {what}")
+            return False
         time.sleep(0.02)
+    return True
+
+
+def stays(condition, what):
+    if not lasts(condition):
+        raise Failed(f"no longer so: {what}")
 
 
 def stat_fields(pid):
@@ -58,6 +64,13 @@ def ticks(pid):
     return sum(map(int, stat_fields(pid)[11:13]))
 
 
+def idle(pid, seconds):
+    """Whether a process lives, uses next to nothing of the processor for so long, and does not queue for it."""
+    before = ticks(pid)
+    time.sleep(seconds)
+    return stat_fields(pid)[:1] == ["S"] and ticks(pid) - before <= 5 * seconds
+
+
 def die_with_parent():
     prctl(PR_SET_PDEATHSIG, signal.SIGKILL)
 
@@ -69,7 +82,11 @@ class Desktop:
         self.env = {
             "HOME": self.home, "XDG_RUNTIME_DIR": self.runtime, "PATH": "/usr/bin:/bin", "TMPDIR": self.home,
             "LANG": "C.UTF-8", "DBUS_SESSION_BUS_ADDRESS": f"unix:path={self.runtime}/bus",
-            "GSETTINGS_BACKEND": "keyfile", "NO_AT_BRIDGE": "1", "SAL_USE_VCLPLUGIN": "gen"}
+            "GSETTINGS_BACKEND": "keyfile", "NO_AT_BRIDGE": "1", "SAL_USE_VCLPLUGIN": "gen",
+            # Strawberry would add it while another of its threads reads the environment, and crash now and then.
+            "SOUP_FORCE_HTTP1": "1",
+            # Its music goes nowhere: after many seeks a stream to the sound server may stand still for ever.
+            "GST_PLUGIN_FEATURE_RANK": "pulsesink:NONE,alsasink:NONE"}
         prctl(PR_SET_CHILD_SUBREAPER, 1)
 
     def bring(self, directory, media=None, programs="kv*"):
@@ -118,15 +135,17 @@ class Desktop:
         os.chmod(os.path.join(self.home, name), 0o755)
 
     def start(self, *command, **options):
+        """A session gets its own share of the processor: Strawberry has a thread that only runs, and ends, when
+        nothing else of its session wants to."""
         with open(os.path.join(self.home, "log"), "ab") as log:
             options = {"env": self.env, "stdin": subprocess.DEVNULL, "stdout": log, "stderr": log, **options}
-            return subprocess.Popen(command, preexec_fn=die_with_parent, **options)
+            return subprocess.Popen(command, preexec_fn=die_with_parent, start_new_session=True, **options)
 
     def read(self, *command):
         """What a command writes; nothing when it fails or takes too long."""
         try:
             return subprocess.run(command, env=self.env, stdin=subprocess.DEVNULL, capture_output=True,
-                                  text=True, check=True, timeout=5).stdout.strip()
+                                  text=True, check=True, timeout=20).stdout.strip()
         except (subprocess.CalledProcessError, subprocess.TimeoutExpired):
             return ""
 
@@ -174,8 +193,7 @@ class Desktop:
 
     def rests(self):
         """Makes sure that kvd lives and does not run in circles."""
-        before = ticks(self.kvd.pid)
-        stays(lambda: self.kvd.poll() is None and ticks(self.kvd.pid) - before < 10, "kvd rests", 1)
+        wait(lambda: idle(self.kvd.pid, 1), "kvd lives and rests")
 
     def last_words(self):
         """The windows, and the end of what the programs wrote."""
@@ -202,9 +220,7 @@ class Desktop:
     def settled(self):
         """Whether the program in front has nothing left to do."""
         pid = self.of_front("_NET_WM_PID").rpartition(" ")[2]
-        before = ticks(pid) if pid.isdigit() else -1
-        time.sleep(0.3)
-        return before >= 0 and ticks(pid) - before <= 1
+        return pid.isdigit() and idle(pid, 0.3)
 
     def full_screen(self):
         """The names of the full-screen windows."""
@@ -225,12 +241,15 @@ class Desktop:
     def corner(self):
         return self.colour(5, 5)
 
-    def volume(self, percent=None):
-        """The volume of the sound server, in percent; sets it first when given."""
-        if percent is not None:
-            self.read("pactl", "set-sink-volume", "@DEFAULT_SINK@", f"{percent}%")
+    def channels(self, *percent):
+        """The volumes of the sound server's channels, in percent; sets them first when given."""
+        if percent:
+            self.read("pactl", "set-sink-volume", "@DEFAULT_SINK@", *(f"{part}%" for part in percent))
         told = self.read("pactl", "get-sink-volume", "@DEFAULT_SINK@")
-        return int((re.findall(r"(\d+)%", told) or [-1])[0])
+        return [int(part) for part in re.findall(r"(\d+)%", told)]
+
+    def volume(self, *percent):
+        return max(self.channels(*percent), default=-1)
 
     def muted(self):
         return self.read("pactl", "get-sink-mute", "@DEFAULT_SINK@") == "Mute: yes"

@@ -1,5 +1,8 @@
 """Films and discs."""
+import time
+
 from desktop import wait
+from music import PLAYING
 from programs import Celluloid, Mpv, Strawberry, Vlc
 
 ON, OFF = {"pause": False, "speed": 1.0}, {"pause": True, "speed": 1.0}
@@ -11,25 +14,27 @@ def scan_ends_in_the_state_before(desktop):
     fast = {"pause": False, "speed": 2.0}
     film.follow(("forward --press", fast), ("forward --release", ON), ("pause", OFF),
                 ("forward --press", fast), ("forward --release", OFF), ("play", ON))
-    start = film.get("time-pos")
+    start = film.position()
     desktop.press("rewind", "--press")
-    wait(lambda: film.get("time-pos") < start - 4, "the film goes back")
+    wait(lambda: 0 < film.position() < start - 4, "the film goes back")
     film.follow(("rewind --release", ON))
-    turned = film.get("time-pos")
-    wait(lambda: film.get("time-pos") > turned + 0.5, "the film goes on")
+    film.plays_on(limit=30)
 
 
 def music_scans_by_seeking(desktop):
     music = Strawberry(desktop)
     desktop.start_kvd()
-    music.follow(("play", {"PlaybackStatus": "Playing"}))
+    music.follow(("play", PLAYING))
+    music.skip(100)
+    began = time.monotonic()
     desktop.press("forward", "--press")
-    wait(lambda: music.position() > 20, "the track goes forward", 15)
+    wait(lambda: music.position() > 120 + time.monotonic() - began, "the track goes forward")
     desktop.press("forward", "--release")
-    reached = music.position()
+    music.plays_on(limit=100)
     desktop.press("rewind", "--press")
-    wait(lambda: music.position() < reached - 5, "the track goes back")
+    wait(lambda: 0 < music.position() < 115, "the track goes back")
     desktop.press("rewind", "--release")
+    music.plays_on(limit=30)
     music.become(PlaybackStatus="Playing", title="Track 1")
 
 

@@ -61,11 +61,11 @@ def write(name, text):
 def music():
     os.mkdir("music")
     for number in COLOURS:
-        ffmpeg(*sound(60, 220 * number), "-metadata", f"title=Track {number}", f"music/{number}.ogg")
+        ffmpeg(*sound(300, 220 * number), "-metadata", f"title=Track {number}", f"music/{number}.ogg")
 
 
 def film():
-    ffmpeg(*picture(120, (90, 90, 90), "320x240"), *sound(120), "-c:v", "mpeg4", "-g", "10", "film.mkv")
+    ffmpeg(*picture(300, (90, 90, 90), "320x240"), *sound(300), "-c:v", "mpeg4", "-g", "10", "film.mkv")
 
 
 def disc():

@@ -1,9 +1,10 @@
 """The programs that play roles, each with something to play, and what they tell of themselves."""
 import glob
 import json
+import math
 import socket
 
-from desktop import wait
+from desktop import Failed, wait
 
 
 class Program:
@@ -61,8 +62,25 @@ class Player(Program):
         return (self.get("Metadata") or {}).get("xesam:title", {}).get("data")
 
     def position(self):
-        """Seconds."""
+        """Seconds; 0 when it does not tell. Strawberry also tells 0 in the midst of a seek."""
         return (self.get("Position") or 0) / 1e6
+
+    def skip(self, seconds):
+        self.ask("call", "Seek", "x", f"{seconds}000000")
+        wait(lambda: self.position() >= seconds, "it skips")
+
+    def plays_on(self, limit):
+        """Waits until it goes back no longer, which must be before it comes to a limit."""
+        lowest = math.inf
+
+        def goes_on():
+            nonlocal lowest
+            now = self.position() or lowest
+            lowest = min(lowest, now)
+            if lowest < limit:
+                raise Failed(f"it still goes back, at {lowest} s")
+            return now > lowest + 1
+        wait(goes_on, "it plays on")
 
     def under_way(self):
         """Some players lose what they are told while they load."""
@@ -73,7 +91,7 @@ class Strawberry(Player):
     def __init__(self, desktop):
         tracks = sorted(glob.glob(f"{desktop.media}/music/*"))
         super().__init__(desktop, "strawberry", "strawberry", "strawberry", *tracks)
-        self.become(CanGoNext=True)
+        self.become(CanGoNext=True, settled=True)
 
 
 class Mpv(Player):
@@ -81,13 +99,14 @@ class Mpv(Player):
         self.channel = f"{desktop.runtime}/mpv"
         super().__init__(desktop, "mpv", "mpv", "mpv", "--vo=x11", f"--input-ipc-server={self.channel}",
                          *options, f"{desktop.media}/film.mkv")
+        wait(lambda: self.get("PlaybackStatus") != "Stopped", "mpv has loaded the film")
 
     def get(self, name):
         """Properties of mpv's own are those that nobody else has."""
         if name[0].isupper() or hasattr(self, name) or hasattr(self.desktop, name):
             return super().get(name)
         with socket.socket(socket.AF_UNIX) as channel:
-            channel.settimeout(2)
+            channel.settimeout(20)
             channel.connect(self.channel)
             channel.sendall(json.dumps({"command": ["get_property", name]}).encode() + b"\n")
             answers = (json.loads(line) for line in channel.makefile())

@@ -1,5 +1,5 @@
 """The volume: of the desktop, and of a player when the desktop's is at its top."""
-from desktop import stays, wait
+from desktop import lasts, wait
 from programs import Mpv, Strawberry
 
 
@@ -11,8 +11,9 @@ def held_volume_goes_on_until_release(desktop):
         desktop.press(button, "--press")
         wait(reached, f"{button} is repeated")
         desktop.press(button, "--release")
-        now = desktop.volume()
-        stays(lambda: desktop.volume() == now, "the volume stands still after the release")
+        # A button that is held is repeated for 10 s at most.
+        wait(lambda: desktop.volume(start) == start and lasts(lambda: desktop.volume() == start),
+             "the volume stands still after the release", 8)
 
 
 def volume_goes_by_five_within_its_limits(desktop):
@@ -25,6 +26,10 @@ def volume_goes_by_five_within_its_limits(desktop):
     desktop.read("pactl", "set-sink-mute", "@DEFAULT_SINK@", "1")
     desktop.press("volume-up")
     wait(lambda: not desktop.muted() and desktop.volume() == 5, "volume up unmutes")
+    desktop.channels(20, 50)
+    for button, ends in (("volume-up", [22, 55]), ("volume-down", [20, 50])):
+        desktop.press(button)
+        wait(lambda: desktop.channels() == ends, f"{button} keeps the balance")
 
 
 def full_volume_raises_the_players_own(desktop):

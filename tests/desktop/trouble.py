@@ -9,9 +9,10 @@ from programs import Mpv, Strawberry
 
 def player_dies_in_mid_scan(desktop):
     music = Strawberry(desktop)
-    film = Mpv(desktop)
+    film = Mpv(desktop, "--start=60")
     desktop.start_kvd()
     desktop.press("rewind", "--press")
+    wait(lambda: 0 < film.position() < 58, "the film goes back")
     film.end()
     desktop.press("rewind", "--release")
     desktop.rests()
@@ -88,5 +89,5 @@ def refuses_to_start(desktop):
     os.mkdir("empty", 0o700)
     elsewhere = {"XDG_RUNTIME_DIR": "empty", "DBUS_SESSION_BUS_ADDRESS": "unix:path=empty/bus"}
     for why, changes in (("the port is taken", {}), ("there is no bus", elsewhere)):
-        if (status := desktop.start("./kvd", env={**desktop.env, **changes}).wait(10)) != 1:
+        if (status := desktop.start("./kvd", env={**desktop.env, **changes}).wait(60)) != 1:
             raise Failed(f"kvd ended with status {status}, though {why}")

@@ -30,7 +30,7 @@
 #include "platform/stage/line_reader.h"
 #include "remote/buttons.h"
 #include "remote/kvd_client.h"
-#include "remote/kvd_messages.h"
+#include "messages/kvd_messages.h"
 #include "remote/words.h"
 #include "tests/linux/fake_session.h"
 #include "tests/linux/fake_windows.h"
