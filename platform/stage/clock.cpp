@@ -62,6 +62,11 @@ bool timeIsVirtual() { return sVirtual; }
 
 Nanoseconds now() { return sVirtual ? sNow : base::bootTime(); }
 
+std::optional<Nanoseconds> earlier(std::optional<Nanoseconds> a, std::optional<Nanoseconds> b) {
+  if (!a || !b) return a ? a : b;
+  return std::min(*a, *b);
+}
+
 void advanceTo(Nanoseconds time) { sNow = std::max(sNow, time); }
 
 void pass(Nanoseconds duration) {

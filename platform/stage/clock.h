@@ -2,6 +2,7 @@
 #pragma once
 
 #include <functional>
+#include <optional>
 
 #include "platform/base/run_loop.h"
 
@@ -19,6 +20,8 @@ void useVirtualTime();
 bool timeIsVirtual();
 
 Nanoseconds now();
+/// The earlier of two times, either of which may never come.
+std::optional<Nanoseconds> earlier(std::optional<Nanoseconds> a, std::optional<Nanoseconds> b);
 /// Moves virtual time forward to `time`; never back, and not at all in real time.
 void advanceTo(Nanoseconds time);
 /// Lets so much time pass: at once in virtual time, by sleeping in real time; there a signal that asks the

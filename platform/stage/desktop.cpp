@@ -139,10 +139,7 @@ void setOutputMuted(bool muted) {
 
 std::optional<Nanoseconds> nextDesktopChange() {
   std::optional<Nanoseconds> next;
-  for (const auto& application : desktop().installed) {
-    const std::optional<Nanoseconds> change = application->nextChange();
-    if (change && (!next || *change < *next)) next = change;
-  }
+  for (const auto& application : desktop().installed) next = earlier(next, application->nextChange());
   return next;
 }
 

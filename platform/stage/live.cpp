@@ -37,7 +37,7 @@ Moment moment() { return {now() - *sBegin - slept().taken, slept().asked}; }
 void wait(const LiveView& view, std::optional<Nanoseconds> deadline) {
   view.idle();
   for (const std::optional<Nanoseconds> other : {nextDesktopChange(), waitEnd(), view.wakeUp()}) {
-    if (other && (!deadline || *other < *deadline)) deadline = other;
+    deadline = earlier(deadline, other);
   }
   base::waitForSources(deadline);
   advanceDesktop();

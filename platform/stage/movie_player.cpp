@@ -37,10 +37,7 @@ void MoviePlayer::ended() { movies_.clear(); }
 
 std::optional<Nanoseconds> MoviePlayer::nextChange() const {
   std::optional<Nanoseconds> next;
-  for (const Movie& movie : movies_) {
-    const auto end = movie.playhead.arrival(movie.length);
-    if (end && (!next || *end < *next)) next = end;
-  }
+  for (const Movie& movie : movies_) next = earlier(next, movie.playhead.arrival(movie.length));
   return next;
 }
 
