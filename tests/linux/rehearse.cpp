@@ -3,14 +3,18 @@
 // Commands come on standard input; each is written again, and indented under it what has reached programs,
 // their channels and windows. Lines that begin with a blank are an earlier transcript's and are passed over.
 //
-//   player NAME WORD…     a player starts, org.mpris.MediaPlayer2.NAME, or as=OTHER; fake_player.cpp has its
-//   words program NAME WORD…    the same for a program that is no player; exe=FILE is what the executable is
-//   called NAME: WORD…           somebody does something there quit NAME; stop NAME and continue NAME, as the
-//   signals do window TITLE of PROGRAM|nobody WORD…   opens one: class=, id=, area=X,Y,W,H, full-screen,
-//   dialog window TITLE WORD…    changes it: ordinary and hidden too close TITLE; front TITLE|nobody|unknown;
-//   keys any|focused|nobody; outputs X,Y,W,H… entry ID KEY=VALUE…   a desktop entry start                 kvd
-//   starts tap, press, release BUTTON; lock on|off; wait TIME tell APPLICATION to … a script as the core runs
-//   one
+// - player NAME WORD…: a player starts, org.mpris.MediaPlayer2.NAME, or as=OTHER; fake_player.cpp has its
+// words
+// - program NAME WORD…: the same for a program that is no player; exe=FILE is what the executable is called
+// - NAME: WORD…: somebody does something there
+// - quit NAME; stop NAME and continue NAME, as the signals do
+// - window TITLE of PROGRAM|nobody WORD…: opens one: class=, id=, area=X,Y,W,H, full-screen, dialog
+// - window TITLE WORD…: changes it: ordinary and hidden too
+// - close TITLE; front TITLE|nobody|unknown; keys any|focused|nobody; outputs X,Y,W,H…
+// - entry ID KEY=VALUE…: a desktop entry
+// - start: kvd starts
+// - tap, press, release BUTTON; lock on|off; wait TIME
+// - tell APPLICATION to …: a script as the core runs one
 
 #include <unistd.h>
 
@@ -24,13 +28,13 @@
 #include <vector>
 
 #include "daemon/lifecycle.h"
+#include "messages/kvd_messages.h"
 #include "platform/linux/host/host.h"
 #include "platform/stage/clock.h"
 #include "platform/stage/fold.h"
 #include "platform/stage/line_reader.h"
 #include "remote/buttons.h"
 #include "remote/kvd_client.h"
-#include "messages/kvd_messages.h"
 #include "remote/words.h"
 #include "tests/linux/fake_session.h"
 #include "tests/linux/fake_windows.h"
