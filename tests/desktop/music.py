@@ -1,9 +1,9 @@
 """Who gets a button, and what a music player makes of it."""
 from desktop import stays, wait
-from programs import Mpv, Player, Program, Strawberry
+from programs import Mpv, Player, Strawberry
 
 PLAYING = {"PlaybackStatus": "Playing", "under_way": True}
-PAUSED, STOPPED = ({"PlaybackStatus": status} for status in ("Paused", "Stopped"))
+PAUSED = {"PlaybackStatus": "Paused"}
 
 # A jukebox cast by its entry, which counts how often it was started.
 ENTRY = ("[Desktop Entry]\nType=Application\nName=Counted\nExec={}/counted\n"
@@ -32,15 +32,6 @@ def back_goes_to_the_start_first(desktop):
     music.become(title="Track 2")
 
 
-def film_pauses_music(desktop):
-    desktop.start_kvd()
-    music = Strawberry(desktop)
-    music.follow(("play", PLAYING))
-    film = Mpv(desktop, "--pause")
-    film.follow(("play", {"pause": False}))
-    music.become(**PAUSED)
-
-
 def frontmost_wins_over_playing(desktop):
     film = Mpv(desktop, "--start=30")
     film.become(pause=False)
@@ -52,16 +43,6 @@ def frontmost_wins_over_playing(desktop):
     film.become(front="mpv")
     film.follow(("play", {"pause": False}))
     wait(lambda: film.position() > 30, "the film has kept its place")
-
-
-def last_chosen_keeps_the_remote(desktop):
-    music = Strawberry(desktop)
-    film = Mpv(desktop, "--pause")
-    desktop.start_kvd()
-    film.follow(("play", {"pause": False}), ("play", {"pause": True}))
-    Program(desktop, "xmessage", "xmessage", "in front")
-    film.follow(("play", {"pause": False}), ("play", {"pause": True}))
-    music.become(**STOPPED)
 
 
 def play_starts_the_music_player(desktop):
