@@ -46,6 +46,7 @@ def lasts(condition, seconds=0.7):
 
 
 def stays(condition, what):
+    """Asks for a while; every answer must be true."""
     if not lasts(condition):
         raise Failed(f"no longer so: {what}")
 
@@ -65,7 +66,7 @@ def ticks(pid):
 
 
 def idle(pid, seconds):
-    """Whether a process lives, uses next to nothing of the processor for so long, and does not queue for it."""
+    """Whether a process lives, uses next to no processor time for so long, and does not queue for it."""
     before = ticks(pid)
     time.sleep(seconds)
     return stat_fields(pid)[:1] == ["S"] and ticks(pid) - before <= 5 * seconds
@@ -83,7 +84,7 @@ class Desktop:
             "HOME": self.home, "XDG_RUNTIME_DIR": self.runtime, "PATH": "/usr/bin:/bin", "TMPDIR": self.home,
             "LANG": "C.UTF-8", "DBUS_SESSION_BUS_ADDRESS": f"unix:path={self.runtime}/bus",
             "GSETTINGS_BACKEND": "keyfile", "NO_AT_BRIDGE": "1", "SAL_USE_VCLPLUGIN": "gen",
-            # Strawberry would add it while another of its threads reads the environment, and crash now and then.
+            # Strawberry would add it while another of its threads reads the environment, and sometimes crash.
             "SOUP_FORCE_HTTP1": "1",
             # Its music goes nowhere: after many seeks a stream to the sound server may stand still for ever.
             "GST_PLUGIN_FEATURE_RANK": "pulsesink:NONE,alsasink:NONE"}
@@ -135,8 +136,8 @@ class Desktop:
         os.chmod(os.path.join(self.home, name), 0o755)
 
     def start(self, *command, **options):
-        """A session gets its own share of the processor: Strawberry has a thread that only runs, and ends, when
-        nothing else of its session wants to."""
+        """In a session of its own, which has its own share of the processor: Strawberry has a thread that
+        runs, and ends, only when nothing else of its session wants to."""
         with open(os.path.join(self.home, "log"), "ab") as log:
             options = {"env": self.env, "stdin": subprocess.DEVNULL, "stdout": log, "stderr": log, **options}
             return subprocess.Popen(command, preexec_fn=die_with_parent, start_new_session=True, **options)
@@ -249,6 +250,7 @@ class Desktop:
         return [int(part) for part in re.findall(r"(\d+)%", told)]
 
     def volume(self, *percent):
+        """That of the loudest channel; -1 without a sound server."""
         return max(self.channels(*percent), default=-1)
 
     def muted(self):

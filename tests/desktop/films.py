@@ -14,11 +14,10 @@ def scan_ends_in_the_state_before(desktop):
     fast = {"pause": False, "speed": 2.0}
     film.follow(("forward --press", fast), ("forward --release", ON), ("pause", OFF),
                 ("forward --press", fast), ("forward --release", OFF), ("play", ON))
-    start = film.position()
     desktop.press("rewind", "--press")
-    wait(lambda: 0 < film.position() < start - 4, "the film goes back")
+    wait(lambda: 0 < film.position() < 56, "the film goes back")
     film.follow(("rewind --release", ON))
-    film.plays_on(limit=30)
+    film.plays_on(beyond=30)
 
 
 def music_scans_by_seeking(desktop):
@@ -30,11 +29,11 @@ def music_scans_by_seeking(desktop):
     desktop.press("forward", "--press")
     wait(lambda: music.position() > 120 + time.monotonic() - began, "the track goes forward")
     desktop.press("forward", "--release")
-    music.plays_on(limit=100)
+    music.plays_on(beyond=120)
     desktop.press("rewind", "--press")
     wait(lambda: 0 < music.position() < 115, "the track goes back")
     desktop.press("rewind", "--release")
-    music.plays_on(limit=30)
+    music.plays_on(beyond=30)
     music.become(PlaybackStatus="Playing", title="Track 1")
 
 

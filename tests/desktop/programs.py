@@ -1,8 +1,8 @@
 """The programs that play roles, each with something to play, and what they tell of themselves."""
 import glob
 import json
-import math
 import socket
+import time
 
 from desktop import Failed, wait
 
@@ -69,18 +69,15 @@ class Player(Program):
         self.ask("call", "Seek", "x", f"{seconds}000000")
         wait(lambda: self.position() >= seconds, "it skips")
 
-    def plays_on(self, limit):
-        """Waits until it goes back no longer, which must be before it comes to a limit."""
-        lowest = math.inf
-
-        def goes_on():
-            nonlocal lowest
-            now = self.position() or lowest
-            lowest = min(lowest, now)
-            if lowest < limit:
-                raise Failed(f"it still goes back, at {lowest} s")
-            return now > lowest + 1
-        wait(goes_on, "it plays on")
+    def plays_on(self, beyond):
+        """Waits until it goes on at about the normal speed, which must be beyond a position."""
+        def at_ease():
+            start, began = self.position(), time.monotonic()
+            time.sleep(1)
+            return 0.3 < (self.position() - start) / (time.monotonic() - began) < 3
+        wait(at_ease, "it goes on at the normal speed")
+        if (reached := wait(self.position, "it tells its position")) < beyond:
+            raise Failed(f"it goes on at {reached} s")
 
     def under_way(self):
         """Some players lose what they are told while they load."""
