@@ -31,7 +31,7 @@ is_installed() {
       ;;
     libncurses-dev) [[ -e /usr/include/ncurses.h || -e /usr/include/curses.h ]] ;;
     libsystemd-dev) pkg-config --exists libsystemd ;;
-    libxcb*-dev) pkg-config --exists xcb xcb-ewmh xcb-icccm xcb-keysyms xcb-randr xcb-res ;;
+    libxcb*-dev) pkg-config --exists xcb xcb-randr xcb-res ;;
     libpulse-dev) pkg-config --exists libpulse ;;
     libglib2.0-dev) pkg-config --exists gio-unix-2.0 ;;
     nlohmann-json3-dev) pkg-config --exists nlohmann_json ;;
