@@ -16,8 +16,6 @@ tap app-menu
 vlc: rc.title=2/3 rc.chapter=4/12 Position=30m
 tap next
   vlc: channel: chapter 5
-tap previous
-  vlc: channel: chapter 3
 tap app-menu
   vlc: channel: key key-disc-menu
 vlc: rc.title=0/3
@@ -44,15 +42,12 @@ press rewind
 wait 0.25s
   +0.25s  vlc: SetPosition /track/1 1798s
 release rewind
-
-# Without rc nobody tells of a menu, nor of chapters: there are keys.
+# Without rc nobody tells of chapters: one goes on or back by key.
 quit vlc
 player vlc url=dvd:///dev/sr0 length=2h playing
 window Dune of vlc class=vlc
-tap next
-  window Dune: key Shift+n
-tap app-menu
-  window Dune: key Shift+m
+tap previous
+  window Dune: key Shift+p
 # A file's chapters are the play list, of which VLC says that it goes on for ever.
 vlc: url=file:///film.mkv Tracks=/track/1,/track/2
 tap next
@@ -61,6 +56,3 @@ vlc: track=/track/2 Position=1m
 tap next
 tap previous
   vlc: Previous
-vlc: track=/track/1
-tap previous
-  vlc: SetPosition /track/1 0s

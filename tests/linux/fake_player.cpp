@@ -1,20 +1,19 @@
 // fake_player WORD…: a program on the session bus, a player (MPRIS 2.2) above all, that does as it is told.
 //
-// The words come on the command line and, a line of them at a time, on standard input:
+// Its words come on the command line and, a line of them at a time, on standard input:
 //
-//   owns=NAME                a name on the bus, $PID in it stands for the process; drops=NAME
-//   playing paused stopped   does so and announces it: somebody did that by hand
-//   PROPERTY=VALUE           a property of MPRIS2, or the title, url, length or track of what it plays
-//   PROPERTY:TYPE=VALUE      the same with a type that it should not have
-//   toggles                  Play and Pause both toggle; restarts: Play begins the track anew
-//   silent                   announces nothing; counts: tells of questions too
-//   says=STATUS              tells this status whatever it does, until says=
-//   ignores=METHOD           answers and does nothing; refuses=, dies=, holds= (answers when told: answers),
-//   and
-//                            to end these obeys=. For Set the property, for mpv's channel the command
-//   win.NAME=BOOLEAN         the state of a GTK action, at the path /win/TITLE
-//   channel=FILE             listens there and speaks like mpv, or like VLC where its executable is called
-//   vlc rc.title=0/3             what VLC answers to "title"; rc.chapter likewise
+// - owns=NAME: a name on the bus, $PID in it stands for the process; drops=NAME
+// - playing, paused, stopped: does so and announces it, as if somebody did that by hand
+// - PROPERTY=VALUE: a property of MPRIS2, or the title, url, length or track of what it plays
+// - PROPERTY:TYPE=VALUE: the same with a type that it should not have
+// - toggles: Play and Pause both toggle; silent: announces nothing; counts: tells of questions too
+// - says=STATUS: tells this status whatever it does, until says=
+// - ignores=METHOD: answers and does nothing; refuses=, dies=, and to end all these obeys=. For Set the
+// property, for mpv's channel the command
+// - holds=METHOD: answers when it is told: answers
+// - win.NAME=BOOLEAN: the state of a GTK action, at the path /win/TITLE
+// - channel=FILE: listens there and speaks like mpv, or like VLC where its executable is called vlc
+// - rc.title=0/3: what VLC answers to "title"; rc.chapter likewise
 //
 // It writes "ready UNIQUE-NAME", and then a line "SERIAL NANOSECONDS TEXT" for every call that reaches it:
 // its caller's number for it (0 for what comes over the channel), and CLOCK_MONOTONIC. A line of input is
@@ -26,12 +25,11 @@
 #include <unistd.h>
 
 #include <algorithm>
-#include <cinttypes>
+#include <chrono>
 #include <cstdint>
-#include <cstdio>
 #include <cstdlib>
-#include <ctime>
 #include <functional>
+#include <iostream>
 #include <iterator>
 #include <map>
 #include <nlohmann/json.hpp>
@@ -95,10 +93,8 @@ Property& property(std::string_view word) {
 }
 
 void tell(std::uint64_t serial, const std::string& text) {
-  timespec now{};
-  clock_gettime(CLOCK_MONOTONIC, &now);
-  const std::int64_t nanoseconds = std::int64_t{now.tv_sec} * 1'000'000'000 + now.tv_nsec;
-  std::printf("%" PRIu64 " %" PRId64 " %s\n", serial, nanoseconds, text.c_str());
+  const auto now = std::chrono::steady_clock::now().time_since_epoch();
+  std::cout << serial << ' ' << std::chrono::nanoseconds(now).count() << ' ' << text << std::endl;
 }
 
 // ---- Values on the bus
@@ -143,22 +139,22 @@ std::vector<std::string> argumentsOf(sd_bus_message* call) {
   const char* contents = nullptr;
   sd_bus_message_rewind(call, 1);
   while (sd_bus_message_peek_type(call, &type, &contents) > 0) {
+    if (type == 'v') {
+      sd_bus_message_enter_container(call, type, contents);
+      continue;
+    }
     union {
       const char* text;
       double real;
       std::int64_t time;
       std::int32_t number;
     } value{};
-    std::ostringstream word;
-    if (type == 'v') {
-      sd_bus_message_enter_container(call, type, contents);
-      continue;
-    }
     if (type == 'a') {
       sd_bus_message_skip(call, nullptr);
     } else {
       sd_bus_message_read_basic(call, type, &value);
     }
+    std::ostringstream word;
     if (type == 's' || type == 'o') word << value.text;
     if (type == 'd') word << value.real;
     if (type == 'x') word << static_cast<double>(value.time) / 1e6 << "s";
@@ -187,7 +183,6 @@ void obey(const std::string& method, const std::vector<std::string>& arguments) 
   const bool plays = property("PlaybackStatus").value == "Playing";
   const bool toggles = notes.contains("toggles") || method == "PlayPause";
   if (method == "Play" || method == "PlayPause" || method == "GoTo") {
-    if (notes.contains("restarts")) setPosition(0);
     setStatus(plays && toggles ? "Paused" : "Playing");
   } else if (method == "Pause" && (plays || toggles)) {
     setStatus(plays ? "Paused" : "Playing");
@@ -317,7 +312,6 @@ const std::map<std::string_view, std::function<void(Value)>> kWords{
     {"paused", [](Value) { setStatus("Paused"); }},
     {"stopped", [](Value) { setStatus("Stopped"); }},
     {"toggles", [](Value) { notes["toggles"] = ""; }},
-    {"restarts", [](Value) { notes["restarts"] = ""; }},
     {"silent", [](Value) { notes["silent"] = ""; }},
     {"counts", [](Value) { notes["counts"] = ""; }},
     {"says", [](Value status) { notes["says"] = status; }},
@@ -346,7 +340,7 @@ void obeyWords(const std::string& line) {
         setProperty(name, value);
       }
     } catch (const remote::UsageError&) {
-      std::printf("! %s\n", word.c_str());
+      std::cout << "! " << word << std::endl;
     }
   }
 }
@@ -373,22 +367,21 @@ bool takeLine() {
   serveLines(talk);
   obeyWords(std::string(line, static_cast<std::size_t>(size)));
   takeInBus();
-  std::puts("done");
+  std::cout << "done" << std::endl;
   return true;
 }
 
 }  // namespace
 
 int main(int argc, char** argv) {
-  std::setvbuf(stdout, nullptr, _IOLBF, 0);
   const char* uniqueName = nullptr;
   if (sd_bus_open_user(&bus) < 0 || sd_bus_add_filter(bus, nullptr, onMessage, nullptr) < 0 ||
       sd_bus_get_unique_name(bus, &uniqueName) < 0) {
-    std::fputs("fake_player: there is no session bus\n", stderr);
+    std::cerr << "fake_player: there is no session bus\n";
     return 1;
   }
   for (int i = 1; i < argc; ++i) obeyWords(argv[i]);
-  std::printf("ready %s\n", uniqueName);
+  std::cout << "ready " << uniqueName << std::endl;
   for (bool goesOn = true; goesOn;) {
     while (sd_bus_process(bus, nullptr) > 0) {
     }

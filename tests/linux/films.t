@@ -1,5 +1,5 @@
 # Films: faster by the player's own rate, scanned by seeking where it has none, stepped frame by frame.
-player mpv title=Dune length=2h MaximumRate=100 playing
+player mpv length=2h MaximumRate=100 playing
 window Dune of mpv class=mpv
 start
 
@@ -31,10 +31,7 @@ release forward
 # A step is one frame, over mpv's channel, else by its key.
 tap next
   window Dune: key .
-mpv: channel=mpv-socket
-tap next
-  mpv: channel: frame-step
-mpv: refuses=frame-step
+mpv: channel=mpv-socket refuses=frame-step
 tell VistremePlayer to step forward front movie
   mpv: channel: frame-step
   fails
@@ -45,8 +42,6 @@ tap next
 mpv: channel=other-socket
 tap next
   mpv: channel: frame-step
-tell VistremePlayer to activate
-  window Dune: activate
 quit mpv
 
 # The modern movie player climbs through its rates, and answers on the screen: in a notification that takes the

@@ -3,9 +3,8 @@
 // Commands come on standard input; each is written again, and indented under it what has reached programs,
 // their channels and windows. Lines that begin with a blank are an earlier transcript's and are passed over.
 //
-// - player NAME WORD…: a player starts, org.mpris.MediaPlayer2.NAME, or as=OTHER; fake_player.cpp has its
-// words
-// - program NAME WORD…: the same for a program that is no player; exe=FILE is what the executable is called
+// - player NAME WORD…: a player starts, org.mpris.MediaPlayer2.NAME, or as=OTHER; see fake_player.cpp
+// - program NAME WORD…: the same for a program that is no player
 // - NAME: WORD…: somebody does something there
 // - quit NAME; stop NAME and continue NAME, as the signals do
 // - window TITLE of PROGRAM|nobody WORD…: opens one: class=, id=, area=X,Y,W,H, full-screen, dialog
@@ -104,10 +103,9 @@ std::optional<std::string> takeValue(Words& words, const std::string& key) {
 void startProgram(Words words, const std::string& prefix) {
   const std::string name = words.at(0);
   words.erase(words.begin());
-  const std::string executable = takeValue(words, "exe").value_or(name);
   const std::string busName = takeValue(words, "as").value_or(name);
   if (!prefix.empty()) words.push_back("owns=" + prefix + busName);
-  fake::startProgram(name, executable, words);
+  fake::startProgram(name, name, words);
 }
 
 Area areaOf(const std::string& text) {

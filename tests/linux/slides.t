@@ -26,10 +26,14 @@ tap playpause
   window Show: key b
 tap next
   window Show: key Right
+tell Slidewell to get frozen
+  = 0
 tap playpause
   window Show: key b
 press forward
   window Show: key End
+tell Slidewell to get frozen
+  = 0
 tap playpause
   window Show: key b
 tap menu
