@@ -100,66 +100,6 @@ TEST(Objects, WordsAreTakenByPositionAndLength) {
   EXPECT_EQ(runScript("name of (get volume settings)"), "error 1: expected the end of the line, found 'of'");
 }
 
-TEST(Objects, StateMachinesOfRealScripts) {
-  const std::string chapterBack = tell(
-      "if chapter > 1 then \n set chapter to chapter - 1 \n else if elapsed time > 5 then \n"
-      " set chapter to 1 \n else \n go to main menu \n end if");
-  const auto chapterFrom = [&](std::int64_t chapter, std::int64_t time) {
-    FakeWorld world;
-    world.player.state[{words::kApp, 0, code("chap")}] = chapter;
-    world.player.state[{words::kApp, 0, code("time")}] = time;
-    runScript(world, chapterBack);
-    return world.log.front();
-  };
-  EXPECT_EQ(chapterFrom(2, 0), "chap of capp#0 = 1");
-  EXPECT_EQ(chapterFrom(1, 6), "chap of capp#0 = 1");
-  EXPECT_EQ(chapterFrom(1, 5), "menu in capp#0");
-
-  const std::string ladder = tell(
-      "set maxRate to 8.0 \n set scanRate to rate of front document \n"
-      " tell front document to show remote hud \n if scanRate is greater than 1.0 then \n"
-      " if scanRate is maxRate then \n set rate of front document to 2.0 \n else \n"
-      " set rate of front document to scanRate * 2 \n end if \n else if scanRate is less than 0.0 then \n"
-      " if scanRate is -2.0 then \n set rate of front document to 1.0 \n else \n"
-      " set rate of front document to scanRate / 2 \n end if \n else \n step forward front document \n end "
-      "if");
-  const std::initializer_list<std::pair<double, const char*>> steps = {
-      {2, "rate of docu#1 = 4.0"},   {8, "rate of docu#1 = 2.0"},   {3, "rate of docu#1 = 6.0"},
-      {-2, "rate of docu#1 = 1.0"},  {-8, "rate of docu#1 = -4.0"}, {1, "stpf in capp#0: docu#1"},
-      {0, "stpf in capp#0: docu#1"},
-  };
-  for (const auto& [rate, expected] : steps) {
-    FakeWorld world;
-    world.player.state[{words::kDoc, 1, code("rate")}] = rate;
-    runScript(world, ladder);
-    EXPECT_EQ(world.log, (std::vector<std::string>{"hud  in docu#1", expected})) << rate;
-  }
-}
-
-TEST(Objects, NextAlbumInDisplayOrder) {
-  const std::string source =
-      "tell application id\"com.tarn.Player\"\n\tset theAlbums to the id of every album\n"
-      "set albumIndex to -1\nrepeat with i from 1 to count theAlbums\n"
-      "if the id of current album is item i of theAlbums then\nset albumIndex to i\nend if\nend repeat\n"
-      "if the current album is album 1 then\ntell application id \"com.tarn.Player\" to activate\n"
-      "select album 4\nelse if current album is album 4\n"
-      "tell application id \"com.tarn.Player\" to activate\nselect album 2\n"
-      "else if the current album is album 2\ntell application id \"com.tarn.Player\" to activate\n"
-      "select album 3\nelse if the current album is album 3\nselect album 5\n"
-      "else if albumIndex >= the (count of theAlbums) then\nselect album (count theAlbums)\n"
-      "else if albumIndex > 0 then\nselect album (albumIndex + 1)\nend if\nend tell";
-  const std::initializer_list<std::pair<std::uint64_t, const char*>> steps = {
-      {1, "none | activate; slct in capp#0: albm#4"}, {2, "none | activate; slct in capp#0: albm#3"},
-      {3, "none | slct in capp#0: albm#5"},           {4, "none | activate; slct in capp#0: albm#2"},
-      {5, "none | slct in capp#0: albm#6"},           {6, "none | slct in capp#0: albm#6"},
-  };
-  for (const auto& [current, expected] : steps) {
-    FakeWorld world;
-    world.player.state[{words::kApp, 0, code("cura")}] = ObjectRef{&world.player, words::kAlbum, current};
-    EXPECT_EQ(runScript(world, source), expected);
-  }
-}
-
 TEST(Objects, ApplicationsThatDoNotRun) {
   const auto whenQuit = [](const std::string& body) {
     FakeWorld world;

@@ -31,14 +31,4 @@ TEST(Lessons, GoOnWithWhatThePersonGotToSee) {
   }
 }
 
-TEST(Lessons, LeaveOutWhatHappenedByItself) {
-  stage::useVirtualTime();
-  stage::setUpDesktop();
-  terminal::Lessons lessons;
-  stage::performCommand("open Spindle");
-  stage::performCommand("tell Spindle to play dvd");
-  lessons.observe(stage::desktop());
-  EXPECT_EQ(lessons.hint(stage::desktop()), "Something plays. Press Space again to pause it.");
-}
-
 }  // namespace

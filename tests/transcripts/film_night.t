@@ -74,30 +74,6 @@ tap play
   script to Lyrabox: if player state is playing then ⏎ pause ⏎ end if
   script to Spindle: if dvd state is playing then ⏎ pause dvd ⏎ else ⏎ play dvd ⏎ end if
   Spindle: plays chapter 3 at 0:36
-
-# Back in the first chapter: to its beginning, and then to the menu.
-tell spindle to set chapter to 1
-  Spindle: goes to chapter 1
-  = 1
-wait 8s
-tap previous
-  asks who is in front: Spindle
-  script to Spindle: if chapter > 1 then ⏎ set chapter to chapter - 1 ⏎ else if elapsed time > 5 then ⏎ set chapter …
-  Spindle: goes to chapter 1
-wait 3s
-tap previous
-  asks who is in front: Spindle
-  script to Spindle: if chapter > 1 then ⏎ set chapter to chapter - 1 ⏎ else if elapsed time > 5 then ⏎ set chapter …
-  Spindle: shows the disc menu, at "Play the film"
-
-# From the menu back to the film.
-tap app-menu
-  asks who is in front: Spindle
-  asks whether Lyrabox runs: yes
-  script to Lyrabox: if player state is playing then ⏎ pause ⏎ end if
-  script to Spindle: get dvd menu active = true
-  script to Spindle: go return to dvd
-  Spindle: plays chapter 1 at 0:03
   end of input
   notification com.tarn.kvd.terminated of com.tarn.kvd
   timer of 10m stops

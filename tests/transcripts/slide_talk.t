@@ -60,16 +60,6 @@ tap forward
   script to Slidewell: get slide switcher visible = false
   script to Slidewell: get playing = true
 
-# While slides show, the volume buttons of the remote stay the volume.
-tap volume-up
-  script: output volume of (get volume settings) = 50
-  sound key up pressed
-  output volume 50 → 55
-  timer of 0.1s starts
-  timer of 0.1s stops
-  script: output volume of (get volume settings) = 55
-  sound key up released
-
 # Menu ends the talk.
 tap menu
   asks who is in front: Slidewell
