@@ -52,3 +52,6 @@ player rhythmbox owns=org.mpris.MediaPlayer2.rhythmbox.instance7
 rhythmbox: drops=org.mpris.MediaPlayer2.rhythmbox
 tell Lyrabox to play
   rhythmbox: Play
+rhythmbox: drops=org.mpris.MediaPlayer2.rhythmbox.instance7
+tell Lyrabox to play
+  fails

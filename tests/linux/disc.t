@@ -9,6 +9,7 @@ tap select
   strawberry: Pause
   vlc: channel: key key-nav-activate
 press forward
+wait 0.5s
 tap app-menu
   vlc: channel: title 1
   vlc: channel: seek 0

@@ -57,6 +57,7 @@ void start(Program& program, const std::vector<std::string>& command) {
   int ends[2];
   if (socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends) != 0) std::abort();
   program.process = fork();
+  if (program.process < 0) std::abort();
   if (program.process == 0) {
     prctl(PR_SET_PDEATHSIG, SIGKILL);
     dup2(ends[1], STDIN_FILENO);

@@ -43,6 +43,13 @@ mpv: channel=other-socket
 tap next
   mpv: channel: frame-step
 quit mpv
+# Neither does a program of another executable get what is meant for mpv.
+player wrapper as=mpv title=Dune channel=mpv-socket
+window Dune of wrapper class=mpv
+front Dune
+tap next
+  window Dune: key .
+quit wrapper
 
 # The modern movie player climbs through its rates, and answers on the screen: in a notification that takes the
 # place of the one before, or in its own picture.

@@ -11,6 +11,21 @@ tap play
   celluloid: Play
 quit celluloid
 
+# What one announces is believed without a question.
+player strawberry counts playing
+  strawberry: GetAll org.mpris.MediaPlayer2
+tell Lyrabox to get player state
+  strawberry: Get org.mpris.MediaPlayer2.Player PlaybackStatus
+  = 'kPSP'
+wait 1s
+strawberry: paused
+tell Lyrabox to get player state
+  = 'kPSU'
+strawberry: playing
+tell Lyrabox to get player state
+  = 'kPSP'
+quit strawberry
+
 # One that announces nothing is asked; one that takes its time is believed for half a second to do as it was told,
 # whatever it announces meanwhile.
 player audacious silent

@@ -1,0 +1,79 @@
+// Two window systems at once, as XWayland beside a compositor.
+
+#include "platform/linux/windows/windows.h"
+
+#include <gtest/gtest.h>
+
+#include "platform/linux/windows/none.h"
+
+namespace {
+
+using namespace linux::windows;
+
+struct System {
+  std::vector<Window> windows;
+  bool knowsFront = true;
+  Reach reach = Reach::AnyWindow;
+  std::uint64_t keyFor = 0;
+};
+System sSystems[2];
+
+template <int which>
+Backend backend() {
+  Backend made = kNone;
+  made.takeIn = [] { return true; };
+  made.list = []() -> const std::vector<Window>& { return sSystems[which].windows; };
+  made.knowsFront = [] { return sSystems[which].knowsFront; };
+  made.reach = [] { return sSystems[which].reach; };
+  made.outputs = [] { return std::vector<Output>{{1, {0, 0, 100 * (which + 1), 100}}}; };
+  made.sendKey = [](std::uint64_t window, std::uint32_t, bool, Modifiers) {
+    sSystems[which].keyFor = window;
+    return true;
+  };
+  return made;
+}
+const Backend kCompositor = backend<0>();
+const Backend kServer = backend<1>();
+
+TEST(Windows, OfTwoBackendsAreMerged) {
+  const auto window = [](const Backend& of, std::uint64_t number, pid_t process, const char* title,
+                         bool active) {
+    Window made;
+    made.id = {&of, number};
+    made.process = process;
+    (process == 0 ? made.applicationID : made.className) = title == std::string("Cat") ? "gimp" : "mpv";
+    made.title = title;
+    made.isActive = active;
+    made.isFullScreen = made.isShown = !active;
+    made.area = {0, 0, 150, 100};
+    return made;
+  };
+  sSystems[0].reach = Reach::Nobody;
+  sSystems[0].windows = {window(kCompositor, 1, 0, "Dune", true), window(kCompositor, 2, 0, "Jaws", false)};
+  sSystems[0].windows[1].isFullScreen = false;
+  sSystems[1].windows = {window(kServer, 7, 42, "Jaws", false), window(kServer, 8, 43, "Cat", true)};
+  init({&kCompositor, &kServer});
+  takeIn();
+
+  ASSERT_EQ(list().size(), 3U) << "both tell of Jaws, each alone of another window";
+  EXPECT_EQ(front()->title, "Dune") << "the first that knows is believed";
+  EXPECT_EQ(list()[1].process, 42);
+  const ID jaws[] = {{&kServer, 7}};
+  EXPECT_EQ(look(jaws).at(0).applicationID, "mpv") << "a window is known by either number";
+  EXPECT_TRUE(sendKey({&kCompositor, 2}, 'a', true, kNoModifier));
+  EXPECT_EQ(sSystems[1].keyFor, 7U) << "the server reaches what the compositor does not";
+  EXPECT_FALSE(sendKey({&kCompositor, 1}, 'a', true, kNoModifier));
+  sSystems[0].reach = Reach::FocusedWindow;
+  EXPECT_TRUE(sendKey({&kCompositor, 1}, 'a', true, kNoModifier)) << "it is the one in front";
+  ASSERT_EQ(outputs().size(), 2U);
+  EXPECT_FALSE(isCaptured(outputs()[0].id)) << "its own window does not cover it";
+  EXPECT_TRUE(isCaptured(outputs()[1].id));
+
+  sSystems[0].knowsFront = false;
+  takeIn();
+  EXPECT_EQ(front()->title, "Cat");
+  finish();
+  EXPECT_TRUE(list().empty());
+}
+
+}  // namespace
