@@ -51,7 +51,7 @@ tell VistremePlayerX to activate
 player rhythmbox owns=org.mpris.MediaPlayer2.rhythmbox.instance7
 rhythmbox: drops=org.mpris.MediaPlayer2.rhythmbox
 tell Lyrabox to play
-  rhythmbox: Play
+  rhythmbox: PlayPause
 rhythmbox: drops=org.mpris.MediaPlayer2.rhythmbox.instance7
 tell Lyrabox to play
   fails

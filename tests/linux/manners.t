@@ -49,16 +49,21 @@ wait 0.5s
 tell Lyrabox to get player state
   = 'kPSP'
 
-# One that refuses, and one that dies of it.
-strawberry: paused refuses=Play
+# One that plays only when it is told to toggle is asked first, whatever it announced.
+strawberry: paused
+strawberry: silent playing
 tell Lyrabox to play
-  strawberry: Play
+
+# One that refuses, and one that dies of it.
+strawberry: paused refuses=PlayPause
+tell Lyrabox to play
+  strawberry: PlayPause
   fails
 tell Lyrabox to get player state
   = 'kPSU'
-strawberry: dies=Play
+strawberry: dies=PlayPause
 tell Lyrabox to play
-  strawberry: Play
+  strawberry: PlayPause
   strawberry: gone
   fails
 

@@ -2,7 +2,7 @@
 player strawberry length=3m
 start
 tap play
-  strawberry: Play
+  strawberry: PlayPause
 tap play
   strawberry: Pause
 tap next

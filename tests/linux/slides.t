@@ -53,7 +53,7 @@ tap play
 close Show
 window Talk class=libreoffice-calc
 tap play
-  strawberry: Play
+  strawberry: PlayPause
 
 # Evince shows in the window that it has. Full screen by its own action is no show.
 program evince win.fullscreen=false

@@ -16,7 +16,7 @@ tap playpause
   mpv: Play
 quit mpv
 tap playpause
-  strawberry: Play
+  strawberry: PlayPause
 # Pick brings it to the front.
 tap pick
   window Song: activate
@@ -40,23 +40,42 @@ tap play
   vlc: Pause
   mpv: Pause
   second: Play
-# Of two in one role the one in front comes first, else the one that plays, else the one that was started last.
+# Of two in one role the one in front comes first, else the one that plays, else the one that was last used, else the
+# one that was started last.
 mpv: playing
 second: paused
 front nobody
 tap play
   mpv: Pause
+tap play
+  mpv: Play
+front Film
+second: playing
+tap play
+  mpv: Pause
+  second: Pause
 front Dune
 tap play
   mpv: Play
 mpv: paused
 front nobody
 tap play
-  second: Play
+  mpv: Play
 
 # Nobody runs: play starts the default player, once; nothing is started while the screen is locked.
 quit second
 quit mpv
+player third as=mpv.instance3 title=Film
+player fourth as=mpv.instance4 title=Film
+tell VistremePlayer to play front movie
+  fourth: Play
+third: playing
+fourth: paused
+third: paused
+tell VistremePlayer to play front movie
+  third: Play
+quit third
+quit fourth
 quit vlc
 quit strawberry
 entry org.gnome.Music DBusActivatable=true

@@ -89,6 +89,8 @@ std::int32_t HostSendEvent(const HostEventDescriptor* event, HostEventDescriptor
   if (instance == nullptr) return kNoSuchProcess;
   const auto* const contents = base::as<base::EventContents>(event->contents);
   if (contents->eventClass != kHookClass || contents->eventID != kRemoteSelect) return kNotUnderstood;
-  programs::bringToFront(*instance);
+  // Of several in its role the core knows the one that was first when the list last changed.
+  const Instance* const first = programs::firstInstance(instance->role);
+  programs::bringToFront(first != nullptr ? *first : *instance);
   return 0;
 }

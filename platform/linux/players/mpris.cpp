@@ -152,7 +152,11 @@ PlayerState stateOf(Player& player) {
 }
 
 PlaybackStatus statusOf(Player& player) {
-  if (const auto status = believedStatus(player)) return *status;
+  const auto status = believedStatus(player);
+  return status ? *status : statusToldBy(player);
+}
+
+PlaybackStatus statusToldBy(Player& player) {
   // Every player has this property.
   const Message answer = ask(player, "Get", mpris::kPlayerInterface, mpris::kPlaybackStatus);
   const char* text = nullptr;
@@ -186,7 +190,14 @@ std::vector<std::string> trackListOf(Player& player) {
 }
 
 void play(Player& player) {
+  if ((player.quirks & kIgnoresPlay) != 0) return toggleToPlay(player);
   if (statusOf(player) != PlaybackStatus::Playing) bringTo(player, PlaybackStatus::Playing, "Play");
+}
+
+void toggleToPlay(Player& player) {
+  const auto wished = believedCommand(player);
+  if ((wished ? *wished : statusToldBy(player)) == PlaybackStatus::Playing) return;
+  bringTo(player, PlaybackStatus::Playing, "PlayPause");
 }
 
 void pause(Player& player) {

@@ -38,7 +38,10 @@ struct PlayerState {
 };
 PlayerState stateOf(Player& player);
 
+/// As its signals told, where it sends them, else as it answers.
 PlaybackStatus statusOf(Player& player);
+/// As it answers now, whatever its signals told.
+PlaybackStatus statusToldBy(Player& player);
 
 /// Of org.mpris.MediaPlayer2; nothing where the player does not tell.
 std::optional<bool> fullscreenOf(Player& player);
@@ -49,6 +52,8 @@ std::vector<std::string> trackListOf(Player& player);
 // Commands. Some players toggle or start over when told to play or pause twice: these act only where the
 // status differs.
 void play(Player& player);
+/// Plays by PlayPause, which must not meet a player that plays already: asks it first.
+void toggleToPlay(Player& player);
 void pause(Player& player);
 /// Ends what plays; in some players, the player.
 void stop(Player& player);

@@ -118,6 +118,7 @@ int takeOwnerChange(sd_bus_message* signal, void*, sd_bus_error*) {
 /// A status that comes while another one is wished for is from before the command.
 void takeStatus(Player& player, PlaybackStatus status) {
   if (player.wish && player.wish->status != status && !player.wish->until.hasPassed()) return;
+  if (status == PlaybackStatus::Playing && player.status != status) player.lastPlayed = nextUse();
   player.status = status;
   player.wish.reset();
 }
@@ -215,6 +216,11 @@ bool takeInPlayers() {
   system::takeInBus();
   awaitIntroductions();
   return std::exchange(sChanged, false);
+}
+
+std::uint64_t nextUse() {
+  static std::uint64_t last = 0;
+  return ++last;
 }
 
 std::list<Player>& list() { return sPlayers; }

@@ -45,9 +45,14 @@ struct Player {
   std::optional<Wish> wish;
   /// Its rate before it was made to play faster; nothing while it plays at its own.
   std::optional<double> ownRate;
+  /// When it was last seen to begin playing, as nextUse counts; 0 for never.
+  std::uint64_t lastPlayed = 0;
   /// Of the program that it is known to be.
   Quirks quirks = kNoQuirk;
 };
+
+/// Counts, from 1, what is done to players and by them, so that the later of two can be told.
+std::uint64_t nextUse();
 
 /// Takes in what the bus has sent. True when players came or went since the last call, or told their desktop
 /// entry. Waits for that once, for each player that has come.

@@ -11,6 +11,8 @@ enum Quirk : std::uint8_t {
   kIgnoresRate = 1,
   /// Raise succeeds and raises nothing.
   kIgnoresRaise = 2,
+  /// Play does nothing when it stands still; PlayPause plays.
+  kIgnoresPlay = 4,
 };
 using Quirks = std::uint8_t;
 

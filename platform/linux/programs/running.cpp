@@ -2,8 +2,10 @@
 
 #include <algorithm>
 #include <functional>
+#include <map>
 #include <span>
 #include <string_view>
+#include <tuple>
 
 #include "platform/base/run_loop.h"
 #include "platform/linux/players/mpris.h"
@@ -26,6 +28,10 @@ std::uint32_t sSeed = 1;
 std::vector<Window> sWindows;
 /// The turn in which those classes were last looked at.
 std::optional<std::uint64_t> sClassesRead;
+
+/// Who was found to be first for a role, and in which turn.
+std::map<Role, HostProcessSerialNumber> sFirst;
+std::uint64_t sFirstFoundIn = 0;
 
 bool belongsTo(const Window& window, const Instance& instance) {
   return window.process != 0 && window.process == instance.process;
@@ -137,10 +143,27 @@ bool plays(const Instance& instance) {
   Player* const player = playerOf(instance);
   if (player == nullptr) return false;
   try {
-    return statusOf(*player) == players::PlaybackStatus::Playing;
+    const bool now = statusOf(*player) == players::PlaybackStatus::Playing;
+    // One that announces nothing is only seen to play where somebody looks.
+    if (now && player->lastPlayed == 0) player->lastPlayed = players::nextUse();
+    return now;
   } catch (const tarnscript::Refusal&) {
     return false;
   }
+}
+
+std::uint64_t lastUse(const Instance& instance) {
+  const Player* const player = playerOf(instance);
+  return std::max(instance.lastSpokenTo, player != nullptr ? player->lastPlayed : 0);
+}
+
+/// Who this turn has found to be first; null where it has found none that is still there.
+const Instance* firstOfThisTurn(Role role) {
+  if (sFirstFoundIn != base::turn()) sFirst.clear();
+  sFirstFoundIn = base::turn();
+  const auto found = sFirst.find(role);
+  const Instance* const first = found != sFirst.end() ? findInstance(found->second) : nullptr;
+  return first != nullptr && first->role == role ? first : nullptr;
 }
 
 }  // namespace
@@ -158,6 +181,10 @@ void takeInDesktop() {
   addPlayers(found);
   addPrograms(found);
   addWindows(found);
+  for (Instance& instance : found) {
+    const Instance* const before = findInstance(instance.serialNumber);
+    if (before != nullptr) instance.lastSpokenTo = before->lastSpokenTo;
+  }
   if (!sameList(found, sInstances)) ++sSeed;
   sInstances = std::move(found);
 }
@@ -172,12 +199,16 @@ std::vector<const Instance*> rankedInstances(Role role) {
   struct Rank {
     bool inFront;
     bool plays;
+    std::uint64_t lastUse;
     std::uint32_t started;
     const Instance* instance;
+
+    auto key() const { return std::tuple(inFront, plays, lastUse, started); }
   };
   std::vector<Rank> ranks;
   for (const Instance& instance : sInstances) {
-    if (instance.role == role) ranks.push_back({false, false, instance.serialNumber.high, &instance});
+    if (instance.role == role)
+      ranks.push_back({false, false, lastUse(instance), instance.serialNumber.high, &instance});
   }
   // Who plays may have to be asked for: only where there is something to choose.
   if (ranks.size() > 1) {
@@ -186,11 +217,7 @@ std::vector<const Instance*> rankedInstances(Role role) {
       rank.plays = plays(*rank.instance);
       rank.inFront = rank.instance == front;
     }
-    std::ranges::stable_sort(ranks, [](const Rank& a, const Rank& b) {
-      if (a.inFront != b.inFront) return a.inFront;
-      if (a.plays != b.plays) return a.plays;
-      return a.started > b.started;
-    });
+    std::ranges::stable_sort(ranks, std::greater(), &Rank::key);
   }
   std::vector<const Instance*> ordered(ranks.size());
   std::ranges::transform(ranks, ordered.begin(), &Rank::instance);
@@ -198,8 +225,16 @@ std::vector<const Instance*> rankedInstances(Role role) {
 }
 
 const Instance* firstInstance(Role role) {
+  if (const Instance* const first = firstOfThisTurn(role)) return first;
   const auto ordered = rankedInstances(role);
-  return ordered.empty() ? nullptr : ordered.front();
+  if (ordered.empty()) return nullptr;
+  sFirst.insert_or_assign(role, ordered.front()->serialNumber);
+  return ordered.front();
+}
+
+void noteSpokenTo(const Instance& instance) {
+  const auto found = std::ranges::find(sInstances, instance.serialNumber, &Instance::serialNumber);
+  if (found != sInstances.end()) found->lastSpokenTo = players::nextUse();
 }
 
 const Instance* findInstance(const HostProcessSerialNumber& serialNumber) {

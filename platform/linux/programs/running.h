@@ -30,6 +30,8 @@ struct Instance {
   std::string owner;
   /// Its windows, topmost first.
   std::vector<windows::ID> windows;
+  /// When it was last told to do something, as players::nextUse counts; 0 for never.
+  std::uint64_t lastSpokenTo = 0;
 };
 
 /// Takes in what the bus and the window systems have sent, and brings the list up to date.
@@ -44,10 +46,14 @@ const std::vector<Instance>& instances();
 /// Whether any program plays the role now.
 bool isPlayed(Role role);
 /// The instances of a role in the order that a person expects: the one in front, then those that play, then
-/// the others, each group with the one that was started last at its head. May ask players what they do.
+/// the others, in each group by when they last played or were spoken to, else by when they were started, the
+/// latest first. May ask players what they do.
 std::vector<const Instance*> rankedInstances(Role role);
-/// The first of them; null when none runs.
+/// The first of them, and it stays so until the turn of the run loop ends, so that a button reaches whom it
+/// was chosen for; null when none runs.
 const Instance* firstInstance(Role role);
+/// Notes that it has been told to do something.
+void noteSpokenTo(const Instance& instance);
 /// Null when it has gone.
 const Instance* findInstance(const HostProcessSerialNumber& serialNumber);
 /// The instance whose window is the active one; null when no program with a role is in front.

@@ -16,6 +16,7 @@ namespace linux::programs {
 namespace {
 
 using players::ChannelKind;
+using players::kIgnoresPlay;
 using players::kIgnoresRaise;
 using players::kIgnoresRate;
 
@@ -29,8 +30,8 @@ namespace spindle = scripting::spindle;
 // One program a row, its actions one a line below it.
 // clang-format off
 constexpr Program kPrograms[] = {
-    {.role = Role::Jukebox, .name = "Strawberry", .entry = "org.strawberrymusicplayer.strawberry", .busName = "strawberry", .windowClass = "strawberry", .quirks = kIgnoresRate},
-    {.role = Role::Jukebox, .name = "Rhythmbox", .entry = "org.gnome.Rhythmbox3", .busName = "rhythmbox", .windowClass = "rhythmbox", .quirks = kIgnoresRate},
+    {.role = Role::Jukebox, .name = "Strawberry", .entry = "org.strawberrymusicplayer.strawberry", .busName = "strawberry", .windowClass = "strawberry", .quirks = kIgnoresRate | kIgnoresPlay},
+    {.role = Role::Jukebox, .name = "Rhythmbox", .entry = "org.gnome.Rhythmbox3", .busName = "rhythmbox", .windowClass = "rhythmbox", .quirks = kIgnoresRate | kIgnoresPlay},
     {.role = Role::Jukebox, .name = "Elisa", .entry = "org.kde.elisa", .busName = "elisa", .windowClass = "elisa", .quirks = kIgnoresRate},
     {.role = Role::Jukebox, .name = "Lollypop", .entry = "org.gnome.Lollypop", .busName = "Lollypop", .windowClass = "lollypop", .quirks = kIgnoresRate},
     {.role = Role::Jukebox, .name = "Amberol", .entry = "io.bassi.Amberol", .busName = "Amberol", .windowClass = "io.bassi.Amberol", .quirks = kIgnoresRate},

@@ -36,7 +36,9 @@ Value RoleApplication::get(const ObjectRef& object, Code property) {
 }
 
 void RoleApplication::set(const ObjectRef& object, Code property, const Value& value) {
-  setBy(performer(), object, property, value);
+  const Performer spokenTo = performer();
+  programs::noteSpokenTo(spokenTo.instance());
+  setBy(spokenTo, object, property, value);
 }
 
 std::vector<ObjectRef> RoleApplication::elements(const ObjectRef& object, Code cls) {
@@ -45,7 +47,11 @@ std::vector<ObjectRef> RoleApplication::elements(const ObjectRef& object, Code c
 
 ObjectRef RoleApplication::elementWithID(const ObjectRef&, Code, const Value&) { refuse(); }
 
-Value RoleApplication::perform(const tarnscript::Event& event) { return performBy(performer(), event); }
+Value RoleApplication::perform(const tarnscript::Event& event) {
+  const Performer spokenTo = performer();
+  programs::noteSpokenTo(spokenTo.instance());
+  return performBy(spokenTo, event);
+}
 
 Value RoleApplication::getBy(const Performer&, const ObjectRef&, Code) { refuse(); }
 
