@@ -58,3 +58,14 @@ tell Snapvale to get slideshow running
 gwenview: stopped
 tell Snapvale to get slideshow running
   = 0
+quit gwenview
+# Professional photos: one that is in no table gets the keys as they are, shifted where they are so.
+entry studio X-Kvd-Application=com.tarn.Lumbra
+program studio
+window Shoot of studio id=studio class=studio
+front Shoot
+tap playpause
+  window Shoot: key Shift+s
+  window Shoot: key Return
+tap right
+  window Shoot: key Right
