@@ -57,18 +57,17 @@ pid_t start(Subprocess& program, const FileDescriptor& input, const FileDescript
   return child;
 }
 
-/// All that comes until the end; nothing when that is too much or takes too long.
-std::optional<std::string> readToEnd(const FileDescriptor& output, std::size_t most,
-                                     const Deadline& deadline) {
-  std::string text;
+/// Reads what comes. False when that is too much or takes too long.
+bool readToEnd(const FileDescriptor& output, std::size_t most, const Deadline& deadline, std::string& text) {
   std::array<char, 65'536> part{};
-  while (text.size() <= most && waitFor(output.get(), POLLIN, deadline)) {
+  // One that never pauses is not waited for, and runs out of time all the same.
+  while (text.size() <= most && !deadline.hasPassed() && waitFor(output.get(), POLLIN, deadline)) {
     const ssize_t count = read(output.get(), part.data(), part.size());
-    if (count == 0) return text;
-    if (count < 0 && errno != EINTR) return std::nullopt;
+    if (count == 0) return true;
+    if (count < 0 && errno != EINTR) return false;
     if (count > 0) text.append(part.data(), static_cast<std::size_t>(count));
   }
-  return std::nullopt;
+  return false;
 }
 
 /// A child may go on when it has closed its output.
@@ -98,12 +97,13 @@ std::optional<SubprocessResult> runToEnd(Subprocess program, std::size_t mostOut
   // The end is seen when the child alone had held the writing end.
   output.writing = FileDescriptor();
 
-  std::optional<std::string> text = readToEnd(output.reading, mostOutput, deadline);
-  const bool ended = text && endsInTime(child, deadline);
+  SubprocessResult result;
+  const bool ended =
+      readToEnd(output.reading, mostOutput, deadline, result.output) && endsInTime(child, deadline);
   if (!ended) kill(child, SIGKILL);
   const int status = reap(child);
-  if (!ended || !WIFEXITED(status)) return std::nullopt;
-  return SubprocessResult{WEXITSTATUS(status), std::move(*text)};
+  if (ended && WIFEXITED(status)) result.status = WEXITSTATUS(status);
+  return result;
 }
 
 }  // namespace base

@@ -22,17 +22,17 @@ struct Subprocess {
   bool discardsErrors = false;
 };
 
-/// What a program that ended by itself left.
+/// What a program left.
 struct SubprocessResult {
-  /// Its exit status, 0 to 255.
-  int status = 0;
-  /// All of its standard output.
+  /// Its exit status, 0 to 255; nothing where it did not end by itself.
+  std::optional<int> status;
+  /// Its standard output, up to its end or to where it was killed.
   std::string output;
 };
 
 /// Starts the program, with no signal blocked or ignored that endLoopOnSignals() blocks or ignores, and waits
-/// until it has ended. Nothing when it cannot be started, is ended by a signal, writes more than `mostOutput`
-/// bytes or has not ended at the deadline; in the last two cases it is killed.
+/// until it has ended. One that has written more than `mostOutput` bytes, or has not ended at the deadline,
+/// is killed. Nothing when it cannot be started.
 std::optional<SubprocessResult> runToEnd(Subprocess program, std::size_t mostOutput,
                                          const Deadline& deadline);
 

@@ -1,37 +1,56 @@
 // The program kvd-entries: tells kvd what the desktop entries say.
 //
-// Without an argument it writes a record for each installed program that plays a role or was cast for one;
-// with
-// --default-music-player the identifier of the person's default for music files.
+// Without an argument it writes a record for each installed program that plays a role or was cast for one,
+// each as soon as it is known; with --default-music-player the identifier of the person's default for music
+// files.
 
 #include <gio/gdesktopappinfo.h>
 
 #include <algorithm>
+#include <cstdint>
 #include <cstdio>
+#include <filesystem>
 #include <memory>
+#include <set>
 #include <string>
 #include <string_view>
+#include <system_error>
 
-#include "platform/linux/programs/entry_records.h"
+#include "platform/linux/programs/entry.h"
 #include "platform/linux/programs/table.h"
 
 namespace {
 
+namespace files = std::filesystem;
 namespace programs = linux::programs;
 using programs::Role;
 
 constexpr const char* kCastKey = "X-Kvd-Application";
 constexpr const char* kMusicTypes[] = {"audio/mpeg", "audio/flac", "audio/x-vorbis+ogg"};
+constexpr std::string_view kSuffix = ".desktop";
+
+/// In bytes: the largest real ones hold a name in every language and have a third of that. What is larger is
+/// no entry.
+constexpr std::uintmax_t kLargestFile = 256 * 1024;
 
 struct StringReleaser {
   void operator()(char* text) const { g_free(text); }
 };
 using OwnedText = std::unique_ptr<char, StringReleaser>;
 
+struct ObjectReleaser {
+  void operator()(gpointer object) const { g_object_unref(object); }
+};
+using OwnedInfo = std::unique_ptr<GDesktopAppInfo, ObjectReleaser>;
+
 std::string textOf(const char* text) { return text != nullptr ? text : ""; }
 
+std::string textOf(GDesktopAppInfo* info, const char* key) {
+  const OwnedText text(g_desktop_app_info_get_string(info, key));
+  return textOf(text.get());
+}
+
 std::string withoutSuffix(std::string id) {
-  constexpr std::string_view kSuffix = ".desktop";
   if (id.ends_with(kSuffix)) id.resize(id.size() - kSuffix.size());
   return id;
 }
@@ -57,56 +76,85 @@ Role roleByCategories(std::string_view categories) {
   return has(categories, "Audio") || has(categories, "Music") ? Role::Jukebox : Role::None;
 }
 
-void describe(GDesktopAppInfo* info, std::string& report) {
-  const std::string id = withoutSuffix(textOf(g_app_info_get_id(G_APP_INFO(info))));
-  const bool cast = g_desktop_app_info_has_key(info, kCastKey) != FALSE;
-  const OwnedText castAs(cast ? g_desktop_app_info_get_string(info, kCastKey) : nullptr);
-  const programs::Program* const known = programs::programByEntry(id);
-  Role role =
-      known != nullptr ? known->role : roleByCategories(textOf(g_desktop_app_info_get_categories(info)));
-  if (cast) role = programs::roleOf(textOf(castAs.get()));
-  if (role == Role::None && !cast) return;
-
-  const OwnedText directory(g_desktop_app_info_get_string(info, "Path"));
-  const bool activatable = g_desktop_app_info_get_boolean(info, "DBusActivatable") != FALSE;
-  const auto put = [&](const std::string& field) { report.append(field).push_back(programs::kFieldEnd); };
-  put(id);
-  put(textOf(g_desktop_app_info_get_startup_wm_class(info)));
-  put(std::to_string(static_cast<int>(role)));
-  put(cast ? "1" : "0");
-  put(activatable ? "1" : "0");
-  put(textOf(directory.get()));
+/// Empty for a program that needs a terminal: it cannot be started without one.
+std::vector<std::string> commandOf(GDesktopAppInfo* info) {
+  std::vector<std::string> words;
   gchar** arguments = nullptr;
-  // A program for a terminal cannot be started without one.
   const bool startable = g_desktop_app_info_get_boolean(info, "Terminal") == FALSE;
   const char* const line = startable ? g_app_info_get_commandline(G_APP_INFO(info)) : nullptr;
-  if (line != nullptr && g_shell_parse_argv(line, nullptr, &arguments, nullptr) != FALSE) {
-    for (gchar** argument = arguments; *argument != nullptr; ++argument) {
-      const std::string_view text = *argument;
-      // %f, %U, %i and the like stand for files and decoration that are not given here.
-      if (text.size() == 2 && text[0] == '%' && text[1] != '%') continue;
-      put(text == "%%" ? "%" : std::string(text));
-    }
-    g_strfreev(arguments);
-  }
-  report.push_back(programs::kRecordEnd);
+  if (line == nullptr || g_shell_parse_argv(line, nullptr, &arguments, nullptr) == FALSE) return words;
+  for (gchar** argument = arguments; *argument != nullptr; ++argument) words.emplace_back(*argument);
+  g_strfreev(arguments);
+  return programs::withoutFieldCodes(words);
 }
 
-std::string reportEntries() {
-  std::string report;
-  GList* const all = g_app_info_get_all();
-  for (GList* item = all; item != nullptr; item = item->next) {
-    if (G_IS_DESKTOP_APP_INFO(item->data)) describe(G_DESKTOP_APP_INFO(item->data), report);
+void report(GDesktopAppInfo* info, const std::string& id) {
+  const programs::Program* const known = programs::programByEntry(id);
+  programs::Entry entry;
+  entry.id = id;
+  entry.cast = g_desktop_app_info_has_key(info, kCastKey) != FALSE;
+  if (entry.cast) {
+    entry.role = programs::roleOf(textOf(info, kCastKey));
+  } else if (known != nullptr) {
+    entry.role = known->role;
+  } else {
+    entry.role = roleByCategories(textOf(g_desktop_app_info_get_categories(info)));
   }
-  return report;
+  if (entry.role == Role::None && !entry.cast) return;
+  entry.windowClass = textOf(g_desktop_app_info_get_startup_wm_class(info));
+  entry.busActivatable = g_desktop_app_info_get_boolean(info, "DBusActivatable") != FALSE;
+  entry.directory = textOf(info, "Path");
+  entry.command = commandOf(info);
+  std::fputs(programs::toRecord(entry).c_str(), stdout);
+  // Should this program be given up, kvd has what was found so far.
+  std::fflush(stdout);
 }
 
-std::string reportDefaultMusicPlayer() {
+/// Whether the file can be read to its end, and in no time: a pipe or a device might never end.
+bool isReadable(const files::path& path) {
+  std::error_code error;
+  if (!files::is_regular_file(path, error)) return false;
+  const std::uintmax_t size = files::file_size(path, error);
+  return !error && size <= kLargestFile;
+}
+
+/// "player.desktop" in a directory "kde" is called "kde-player".
+std::string idOf(const files::path& path, const files::path& directory) {
+  std::string id = path.lexically_relative(directory).string();
+  std::replace(id.begin(), id.end(), '/', '-');
+  return withoutSuffix(std::move(id));
+}
+
+/// Of several entries with one identifier the first that is found counts, though it may say that there is
+/// none (Hidden).
+void reportDirectory(const files::path& directory, std::set<std::string>& known) {
+  std::error_code error;
+  for (files::recursive_directory_iterator found(directory, error), end; !error && found != end;
+       found.increment(error)) {
+    const files::path& path = found->path();
+    if (path.extension() != kSuffix || !isReadable(path)) continue;
+    const std::string id = idOf(path, directory);
+    if (!known.insert(id).second) continue;
+    const OwnedInfo info(g_desktop_app_info_new_from_filename(path.c_str()));
+    if (info != nullptr && g_desktop_app_info_get_is_hidden(info.get()) == FALSE) report(info.get(), id);
+  }
+}
+
+void reportEntries() {
+  std::set<std::string> known;
+  reportDirectory(files::path(g_get_user_data_dir()) / "applications", known);
+  for (const gchar* const* directory = g_get_system_data_dirs(); *directory != nullptr; ++directory) {
+    reportDirectory(files::path(*directory) / "applications", known);
+  }
+}
+
+void reportDefaultMusicPlayer() {
   for (const char* type : kMusicTypes) {
     GAppInfo* const info = g_app_info_get_default_for_type(type, FALSE);
-    if (info != nullptr) return withoutSuffix(textOf(g_app_info_get_id(info)));
+    if (info == nullptr) continue;
+    std::fputs(withoutSuffix(textOf(g_app_info_get_id(info))).c_str(), stdout);
+    return;
   }
-  return {};
 }
 
 }  // namespace
@@ -117,7 +165,10 @@ int main(int argc, char** argv) {
     std::fprintf(stderr, "Usage: kvd-entries [%s]\n", programs::kDefaultMusicPlayerOption);
     return 2;
   }
-  const std::string report = option.empty() ? reportEntries() : reportDefaultMusicPlayer();
-  const bool written = std::fwrite(report.data(), 1, report.size(), stdout) == report.size();
-  return written && std::fflush(stdout) == 0 ? 0 : 1;
+  if (option.empty()) {
+    reportEntries();
+  } else {
+    reportDefaultMusicPlayer();
+  }
+  return std::fflush(stdout) == 0 && std::ferror(stdout) == 0 ? 0 : 1;
 }

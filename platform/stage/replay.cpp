@@ -23,7 +23,7 @@ std::optional<std::string> playAgain(const std::string& commands) {
       {.path = "/proc/self/exe", .arguments = {"kvd-stage"}, .input = commands, .discardsErrors = true},
       kLongestTranscript, base::Deadline(kLongestPlay));
   // A command of a transcript that was wrong, status 1, is no failure of the play.
-  if (!play || play->status > 1) return std::nullopt;
+  if (!play || play->status.value_or(2) > 1) return std::nullopt;
   return std::move(play->output);
 }
 

@@ -43,13 +43,15 @@ TEST(Subprocess, WhatItSaysAndHowItEndsComeBack) {
   }
 }
 
-TEST(Subprocess, WhatDoesNotEndByItselfLeavesNothing) {
+TEST(Subprocess, WhatDoesNotEndByItselfHasNoStatus) {
   EXPECT_FALSE(base::runToEnd({.path = "/nonexistent"}, kMost, base::Deadline(kAges)));
-  EXPECT_FALSE(runShell("echo said; kill -KILL $$", kAges));
-  EXPECT_FALSE(runShell("cat; echo", kAges, std::string(kMost, 'x'))) << "a byte too many";
-  EXPECT_FALSE(runShell("while :; do echo more; done", kAges));
-  EXPECT_FALSE(runShell("echo said; exec sleep 1000", 20ms));
-  EXPECT_FALSE(runShell("exec >&-; exec sleep 1000", 20ms)) << "it ended its output, not itself";
+  const auto killed = runShell("echo said; kill -KILL $$", kAges);
+  EXPECT_FALSE(killed->status);
+  EXPECT_EQ(killed->output, "said\n");
+  EXPECT_FALSE(runShell("cat; echo", kAges, std::string(kMost, 'x'))->status) << "a byte too many";
+  EXPECT_FALSE(runShell("while :; do echo more; done", kAges)->status);
+  EXPECT_FALSE(runShell("echo said; exec sleep 1000", 20ms)->status);
+  EXPECT_FALSE(runShell("exec >&-; exec sleep 1000", 20ms)->status) << "it ended its output, not itself";
   EXPECT_EQ(waitpid(-1, nullptr, WNOHANG), -1) << "a child was left";
   EXPECT_EQ(errno, ECHILD);
 }
@@ -60,7 +62,7 @@ TEST(Subprocess, TheRunLoopsSignalsAreNotInherited) {
   sigprocmask(SIG_BLOCK, &ending, &before);
   const auto previous = std::signal(SIGPIPE, SIG_IGN);
   for (const std::string signal : {"TERM", "PIPE"}) {
-    EXPECT_FALSE(runShell("kill -" + signal + " $$; echo alive", kAges)) << signal;
+    EXPECT_FALSE(runShell("kill -" + signal + " $$; echo alive", kAges)->status) << signal;
   }
   std::signal(SIGPIPE, previous);
   sigprocmask(SIG_SETMASK, &before, nullptr);

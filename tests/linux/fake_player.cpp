@@ -12,6 +12,7 @@
 // property, for mpv's channel the command
 // - holds=METHOD: answers when it is told: answers
 // - win.NAME=BOOLEAN: the state of a GTK action, at the path /win/TITLE
+// - hears=INTERFACE: tells of its signals
 // - channel=FILE: listens there and speaks like mpv, or like VLC where its executable is called vlc
 // - rc.title=0/3: what VLC answers to "title"; rc.chapter likewise
 //
@@ -236,6 +237,8 @@ std::string textOf(sd_bus_message* call) {
 std::string talk(const std::string& line);
 
 int onMessage(sd_bus_message* call, void*, sd_bus_error*) {
+  const char* const interface = sd_bus_message_get_interface(call);
+  if (interface != nullptr && interface == note("hears")) tell(0, textOf(call));
   if (sd_bus_message_is_method_call(call, nullptr, nullptr) <= 0) return 0;
   // Whoever waits for the answer has written to the channel before, if at all.
   if (sd_bus_message_get_expect_reply(call) > 0) serveLines(talk);
@@ -290,6 +293,11 @@ void own(std::string name) {
   sd_bus_request_name(bus, name.c_str(), 0);
 }
 
+void hear(const std::string& interface) {
+  notes["hears"] = interface;
+  sd_bus_add_match(bus, nullptr, ("type='signal',interface='" + interface + "'").c_str(), nullptr, nullptr);
+}
+
 void answerHeld() {
   for (sd_bus_message* call : held) {
     answer(call);
@@ -323,6 +331,7 @@ const std::map<std::string_view, std::function<void(Value)>> kWords{
     {"dies", [](Value method) { notes[method] = "dies"; }},
     {"holds", [](Value method) { notes[method] = "holds"; }},
     {"obeys", [](Value method) { notes.erase(method); }},
+    {"hears", hear},
     {"answers", [](Value) { answerHeld(); }},
     {"channel", [](Value file) { listenForLines(std::string(std::getenv("XDG_RUNTIME_DIR")) + "/" + file); }},
 };

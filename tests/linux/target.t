@@ -5,7 +5,9 @@ window Song of strawberry class=strawberry
 window Dune of mpv class=mpv
 front Dune
 strawberry: playing
+program shell hears=com.tarn.kvd.Notifications
 start
+  shell: Posted com.tarn.kvd.started com.tarn.kvd
 tap playpause
   strawberry: Pause
   mpv: Play
@@ -20,13 +22,25 @@ tap playpause
 # Pick brings it to the front.
 tap pick
   window Song: activate
+# Of two the one that plays, whoever did when they came.
+player rhythmbox playing
+window Tune of rhythmbox class=rhythmbox
+front nobody
+tap next
+  rhythmbox: Next
+rhythmbox: stopped
+strawberry: playing
+tap pick
+  window Song: activate
+quit rhythmbox
+strawberry: paused
 # Where nobody can tell who is in front, nobody is.
 player mpv title=Dune
 window Dune of mpv class=mpv
 front Dune
 front unknown
 tap playpause
-  strawberry: Pause
+  strawberry: PlayPause
 
 # Whoever starts silences the others first, in every role and in its own.
 player vlc playing url=file:///film.mkv

@@ -7,12 +7,10 @@
 #include <chrono>
 #include <cstdlib>
 #include <filesystem>
-#include <optional>
 #include <system_error>
 #include <utility>
 
 #include "platform/base/subprocess.h"
-#include "platform/linux/programs/entry_records.h"
 #include "platform/text/case.h"
 
 namespace linux::programs {
@@ -34,14 +32,13 @@ std::string readerPath() {
   return directory / KVD_LIBEXEC_FROM_BIN / "kvd-entries";
 }
 
-/// What the reader says; nothing when it failed.
-std::optional<std::string> askReader(const char* option) {
+/// What the reader says, up to where it failed or was given up; nothing where it could not be started.
+std::string askReader(const char* option) {
   const std::string path = readerPath();
   base::Subprocess reader{.path = path, .arguments = {path}};
   if (option != nullptr) reader.arguments.emplace_back(option);
   auto said = base::runToEnd(std::move(reader), kLongestReport, base::Deadline(kReadingLimit));
-  if (!said || said->status != 0) return std::nullopt;
-  return std::move(said->output);
+  return said ? std::move(said->output) : std::string();
 }
 
 std::vector<std::string> split(std::string_view text, char end) {
@@ -54,21 +51,11 @@ std::vector<std::string> split(std::string_view text, char end) {
   return parts;
 }
 
-std::vector<Entry> parse(const std::string& text) {
-  constexpr std::size_t kFixedFields = 6;
+/// A line that was cut short is no record.
+std::vector<Entry> parse(const std::string& report) {
   std::vector<Entry> parsed;
-  for (const std::string& record : split(text, kRecordEnd)) {
-    const std::vector<std::string> fields = split(record, kFieldEnd);
-    if (fields.size() < kFixedFields) continue;
-    Entry entry;
-    entry.id = fields[0];
-    entry.windowClass = fields[1];
-    entry.role = static_cast<Role>(std::stoi(fields[2]));
-    entry.cast = fields[3] == "1";
-    entry.busActivatable = fields[4] == "1";
-    entry.directory = fields[5];
-    entry.command.assign(fields.begin() + kFixedFields, fields.end());
-    parsed.push_back(std::move(entry));
+  for (const std::string& line : split(report, '\n')) {
+    if (auto entry = fromRecord(line)) parsed.push_back(*std::move(entry));
   }
   return parsed;
 }
@@ -112,7 +99,7 @@ const std::vector<Entry>& entries() {
   if (times == sTimes) return sEntries;
   // A reader that failed is not tried again before something has changed: it may have taken its full time.
   sTimes = std::move(times);
-  if (const auto text = askReader(nullptr)) sEntries = parse(*text);
+  sEntries = parse(askReader(nullptr));
   return sEntries;
 }
 
@@ -129,7 +116,7 @@ const Entry* entryByWindowClass(std::string_view windowClass) {
 }
 
 std::string defaultMusicPlayer() {
-  const std::string id = askReader(kDefaultMusicPlayerOption).value_or("");
+  const std::string id = askReader(kDefaultMusicPlayerOption);
   const Entry* const entry = entryByID(id);
   return entry != nullptr && entry->role == Role::Jukebox ? entry->id : "";
 }

@@ -93,6 +93,14 @@ bool appendTexts(sd_bus_message* message, const char* property, const std::vecto
          sd_bus_message_close_container(message) >= 0 && sd_bus_message_close_container(message) >= 0;
 }
 
+/// The service manager puts the environment's values for "$NAME" and "${NAME}", and "$" for "$$".
+std::vector<std::string> escaped(std::vector<std::string> words) {
+  for (std::string& word : words) {
+    for (std::size_t at = 0; (at = word.find('$', at)) != std::string::npos; at += 2) word.insert(at, 1, '$');
+  }
+  return words;
+}
+
 /// Adds the property ExecStart, an array of one command: (sv) with v of a(sasb).
 bool appendCommand(sd_bus_message* message, const std::vector<std::string>& command) {
   return sd_bus_message_open_container(message, 'r', "sv") >= 0 &&
@@ -101,7 +109,7 @@ bool appendCommand(sd_bus_message* message, const std::vector<std::string>& comm
          sd_bus_message_open_container(message, 'a', "(sasb)") >= 0 &&
          sd_bus_message_open_container(message, 'r', "sasb") >= 0 &&
          sd_bus_message_append(message, "s", command.front().c_str()) >= 0 &&
-         sd_bus_message_append_strv(message, pointers(command).data()) >= 0 &&
+         sd_bus_message_append_strv(message, pointers(escaped(command)).data()) >= 0 &&
          sd_bus_message_append(message, "b", 0) >= 0 && sd_bus_message_close_container(message) >= 0 &&
          sd_bus_message_close_container(message) >= 0 && sd_bus_message_close_container(message) >= 0 &&
          sd_bus_message_close_container(message) >= 0;
