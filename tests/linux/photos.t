@@ -49,6 +49,13 @@ front Editor
 tell Snapvale to select album 5
   window Editor: key Left
 keys any
+# Who was spoken to last goes before who came last.
+program gthumb
+window Album of gthumb class=gthumb
+front nobody
+tell Snapvale to select album 5
+  window Editor: key Left
+quit gthumb
 quit shotwell
 # The show of a player that is stopped is its ordinary window.
 player gwenview as=Gwenview playing

@@ -33,14 +33,13 @@ strawberry: playing
 tap pick
   window Song: activate
 quit rhythmbox
-strawberry: paused
 # Where nobody can tell who is in front, nobody is.
 player mpv title=Dune
 window Dune of mpv class=mpv
 front Dune
 front unknown
 tap playpause
-  strawberry: PlayPause
+  strawberry: Pause
 
 # Whoever starts silences the others first, in every role and in its own.
 player vlc playing url=file:///film.mkv
