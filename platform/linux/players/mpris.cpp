@@ -112,11 +112,18 @@ void readProperty(sd_bus_message* message, std::string_view key, std::string_vie
   }
 }
 
+/// What is not answered in time is on its way all the same: a busy player comes to it.
 template <typename... Arguments>
 void command(Player& player, const Method& method, const char* types, Arguments... arguments) {
-  if (system::call(player.callee, method, kCommandLimit, types, arguments...) == nullptr) {
+  if (system::timedOutThisTurn(player.callee.process)) {
+    if (!system::send(player.callee, method, types, arguments...)) refuse("the player cannot be reached");
+    return;
+  }
+  const Message answer = system::call(player.callee, method, kCommandLimit, types, arguments...);
+  if (answer == nullptr && !system::timedOutThisTurn(player.callee.process)) {
     refuse("the player cannot or will not");
   }
+  if (answer != nullptr) settle(player);
 }
 
 template <typename Argument>
@@ -136,6 +143,17 @@ void bringTo(Player& player, PlaybackStatus wanted, const char* member) {
     player.wish.reset();
     throw;
   }
+}
+
+/// Of a command that was not waited for.
+int takeAnswer(sd_bus_message* answer, void* context, sd_bus_error*) {
+  Player& player = *static_cast<Player*>(context);
+  if (sd_bus_message_is_method_error(answer, nullptr) != 0) {
+    player.wish.reset();
+  } else {
+    settle(player);
+  }
+  return 0;
 }
 
 }  // namespace
@@ -160,10 +178,12 @@ PlaybackStatus statusToldBy(Player& player) {
   // Every player has this property.
   const Message answer = ask(player, "Get", mpris::kPlayerInterface, mpris::kPlaybackStatus);
   const char* text = nullptr;
-  if (answer == nullptr || sd_bus_message_read(answer.get(), "v", "s", &text) <= 0) {
+  if (answer != nullptr && sd_bus_message_read(answer.get(), "v", "s", &text) > 0) {
+    player.lastKnown = mpris::statusNamed(text).value_or(PlaybackStatus::Stopped);
+  } else if (!player.lastKnown) {
     refuse("the player does not answer");
   }
-  return mpris::statusNamed(text).value_or(PlaybackStatus::Stopped);
+  return *player.lastKnown;
 }
 
 std::optional<bool> fullscreenOf(Player& player) {
@@ -204,7 +224,9 @@ void pause(Player& player) {
   if (statusOf(player) != PlaybackStatus::Playing) return;
   believe(player, PlaybackStatus::Paused);
   // Not waited for: the player that is about to start shall not be held up by those that make room for it.
-  if (!system::send(player.callee, {mpris::kPath, mpris::kPlayerInterface, "Pause"}, "")) {
+  player.commanding = system::callLater(
+      system::makeCall(player.callee, {mpris::kPath, mpris::kPlayerInterface, "Pause"}), takeAnswer, &player);
+  if (player.commanding == nullptr) {
     player.wish.reset();
     refuse("the player cannot be reached");
   }

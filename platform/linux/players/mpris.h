@@ -2,7 +2,8 @@
 //
 // A player's playback status is taken from its signals once it has been seen to send them, and asked for
 // before that. Optional properties are read with GetAll, never with Get, which makes some players end.
-// Operations throw tarnscript::Refusal where the player cannot or will not.
+// Operations throw tarnscript::Refusal where the player cannot or will not. A command that is not answered in
+// time is taken for done: a busy player comes to it.
 #pragma once
 
 #include <cstdint>
@@ -40,7 +41,7 @@ PlayerState stateOf(Player& player);
 
 /// As its signals told, where it sends them, else as it answers.
 PlaybackStatus statusOf(Player& player);
-/// As it answers now, whatever its signals told.
+/// As it answers now, whatever its signals told, or as last known where it does not answer in time.
 PlaybackStatus statusToldBy(Player& player);
 
 /// Of org.mpris.MediaPlayer2; nothing where the player does not tell.

@@ -20,8 +20,9 @@ using system::Message;
 using system::readDictionary;
 using system::readText;
 
-/// How long a player may take to do what it has been told. Until then the answer to a question may be older
-/// than the command.
+/// How long a player may take to answer a command, and then to do what it has been told. Until then the
+/// answer to a question may be older than the command.
+constexpr std::chrono::milliseconds kAnswering{1500};
 constexpr std::chrono::milliseconds kSettling{500};
 
 /// A player for other players; its status is that of somebody who is on the list already.
@@ -45,30 +46,42 @@ std::string entryFrom(std::string text) {
   return text.find('/') == std::string::npos ? text : std::string();
 }
 
-int takeIntroduction(sd_bus_message* answer, void*, sd_bus_error*) {
-  const char* const sender = sd_bus_message_get_sender(answer);
-  Player* const player = sender != nullptr ? findPlayer(sender) : nullptr;
-  if (player == nullptr) return 0;
+int takeIntroduction(sd_bus_message* answer, void* context, sd_bus_error*) {
+  Player& player = *static_cast<Player*>(context);
   if (sd_bus_message_is_method_error(answer, nullptr) != 0) {
-    player->introduction = Introduction::Refused;
+    player.introduction = Introduction::Refused;
     return 0;
   }
-  player->introduction = Introduction::Complete;
+  player.introduction = Introduction::Complete;
   readDictionary(answer, [&](std::string_view key, std::string_view type) {
-    if (key == "DesktopEntry") player->desktopEntry = entryFrom(readText(answer, type).value_or(""));
+    if (key == "DesktopEntry") player.desktopEntry = entryFrom(readText(answer, type).value_or(""));
   });
+  sChanged = true;
+  return 0;
+}
+
+int takeProcess(sd_bus_message* answer, void* context, sd_bus_error*) {
+  Player& player = *static_cast<Player*>(context);
+  std::uint32_t process = 0;
+  sd_bus_message_read(answer, "u", &process);
+  player.callee.process = static_cast<pid_t>(process);
+  player.processIsKnown = true;
   sChanged = true;
   return 0;
 }
 
 /// Asks who it is, for as long as the player is there: one that is stopped answers when it is continued.
 void introduce(Player& player) {
-  const Message request =
-      system::makeCall(player.callee, {mpris::kPath, mpris::kPropertiesInterface, "GetAll"});
-  if (request != nullptr && sd_bus_message_append(request.get(), "s", mpris::kRootInterface) >= 0 &&
-      sd_bus_call_async(bus(), nullptr, request.get(), takeIntroduction, nullptr, UINT64_MAX) >= 0) {
-    player.introduction = Introduction::Awaited;
-  }
+  Message request = system::makeCall(player.callee, {mpris::kPath, mpris::kPropertiesInterface, "GetAll"});
+  if (request == nullptr || sd_bus_message_append(request.get(), "s", mpris::kRootInterface) < 0) return;
+  player.introducing = system::callLater(std::move(request), takeIntroduction, &player);
+  if (player.introducing != nullptr) player.introduction = Introduction::Awaited;
+}
+
+void findProcess(Player& player) {
+  Message request = system::makeCall(kBusItself, {kBusPath, kBusInterface, "GetConnectionUnixProcessID"});
+  if (request == nullptr || sd_bus_message_append(request.get(), "s", player.callee.name.c_str()) < 0) return;
+  player.findingProcess = system::callLater(std::move(request), takeProcess, &player);
 }
 
 void arrive(const std::string& name, const std::string& owner) {
@@ -76,8 +89,9 @@ void arrive(const std::string& name, const std::string& owner) {
   if (findPlayer(owner) != nullptr) return;
   Player& player = sPlayers.emplace_back();
   player.name = name;
-  player.callee = {owner, system::processBehind(owner.c_str())};
+  player.callee = {owner, 0};
   sChanged = true;
+  findProcess(player);
   introduce(player);
 }
 
@@ -119,7 +133,7 @@ int takeOwnerChange(sd_bus_message* signal, void*, sd_bus_error*) {
 void takeStatus(Player& player, PlaybackStatus status) {
   if (player.wish && player.wish->status != status && !player.wish->until.hasPassed()) return;
   if (status == PlaybackStatus::Playing && player.status != status) player.lastPlayed = nextUse();
-  player.status = status;
+  player.status = player.lastKnown = status;
   player.wish.reset();
 }
 
@@ -188,8 +202,9 @@ void beginAnew() {
 }
 
 bool anyAwaited() {
-  return std::any_of(sPlayers.begin(), sPlayers.end(),
-                     [](const Player& player) { return player.introduction == Introduction::Awaited; });
+  return std::any_of(sPlayers.begin(), sPlayers.end(), [](const Player& player) {
+    return player.introduction == Introduction::Awaited || !player.processIsKnown;
+  });
 }
 
 /// Waits for newcomers to introduce themselves; one that does not is a late one from then on.
@@ -197,12 +212,17 @@ void awaitIntroductions() {
   for (Player& player : sPlayers) {
     if (player.introduction == Introduction::Refused) introduce(player);
   }
-  const base::Deadline deadline(kQueryLimit);
+  const system::Limit limit = system::patience(kQueryLimit);
+  const base::Deadline deadline(limit);
   while (anyAwaited()) {
     system::takeInBus();
-    if (!anyAwaited() || !system::waitForBus(deadline)) break;
+    if (!anyAwaited()) return;
+    if (!system::waitForBus(deadline)) break;
   }
+  if (!anyAwaited()) return;
+  system::noteWaitInVain(limit);
   for (Player& player : sPlayers) {
+    player.processIsKnown = true;
     if (player.introduction != Introduction::Awaited) continue;
     player.introduction = Introduction::Late;
     system::noteTimeout(player.callee.process);
@@ -242,7 +262,12 @@ std::optional<PlaybackStatus> believedStatus(const Player& player) {
 
 void believe(Player& player, PlaybackStatus status) {
   player.status.reset();
-  player.wish = Wish{status, base::Deadline(kSettling)};
+  player.lastKnown = status;
+  player.wish = Wish{status, base::Deadline(kAnswering)};
+}
+
+void settle(Player& player) {
+  if (player.wish) player.wish->until = base::Deadline(kSettling);
 }
 
 }  // namespace linux::players

@@ -16,8 +16,8 @@ namespace linux::players {
 
 enum class PlaybackStatus : std::uint8_t { Playing, Paused, Stopped };
 
-/// The status that a command leads to: believed for a moment, as many players answer the command first and do
-/// it then, and some say that they are paused while they seek.
+/// The status that a command leads to: believed until the command has been answered and for a moment after
+/// that, as many players answer first and do it then, and some say that they are paused while they seek.
 struct Wish {
   PlaybackStatus status;
   base::Deadline until;
@@ -40,15 +40,21 @@ struct Player {
   /// Without ".desktop"; empty where the player does not tell.
   std::string desktopEntry;
   Introduction introduction = Introduction::Refused;
+  /// The bus has answered, or was waited for in vain.
+  bool processIsKnown = false;
   /// As its last signal told; nothing while no signal has, and after a command of ours.
   std::optional<PlaybackStatus> status;
   std::optional<Wish> wish;
+  /// As it was last told, believed or answered: what is gone by where a question is not answered in time.
+  std::optional<PlaybackStatus> lastKnown;
   /// Its rate before it was made to play faster; nothing while it plays at its own.
   std::optional<double> ownRate;
   /// When it was last seen to begin playing, as nextUse counts; 0 for never.
   std::uint64_t lastPlayed = 0;
   /// Of the program that it is known to be.
   Quirks quirks = kNoQuirk;
+  /// For the answers that it owes: who it is, its process, to the last command that was not waited for.
+  system::Slot introducing, findingProcess, commanding;
 };
 
 /// Counts, from 1, what is done to players and by them, so that the later of two can be told.
@@ -71,7 +77,9 @@ std::optional<PlaybackStatus> believedCommand(const Player& player);
 /// asked.
 std::optional<PlaybackStatus> believedStatus(const Player& player);
 
-/// From here on for a moment the player is believed to do this.
+/// From here on the player is believed to do this.
 void believe(Player& player, PlaybackStatus status);
+/// The command has been answered: from here on it is believed for a moment only.
+void settle(Player& player);
 
 }  // namespace linux::players

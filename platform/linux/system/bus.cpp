@@ -94,11 +94,10 @@ void closeBus() {
 unsigned busGeneration() { return sGeneration; }
 
 void takeInBus() {
+  constexpr int kMostMessages = 256;
   if (sBus == nullptr) return;
-  int done = 0;
-  do {
-    done = sd_bus_process(sBus, nullptr);
-  } while (done > 0);
+  int done = 1;
+  for (int i = 0; done > 0 && i < kMostMessages; ++i) done = sd_bus_process(sBus, nullptr);
   // Busy means that this was called from a handler of a message, which the caller up there goes on with.
   if (done < 0 && done != -EBUSY) loseConnection();
 }
@@ -119,10 +118,17 @@ Message makeCall(const Callee& callee, const Method& method) {
 
 Message call(const Callee& callee, Message request, Limit limit) {
   if (request == nullptr || timedOutThisTurn(callee.process)) return nullptr;
+  limit = patience(limit);
   sd_bus_message* answer = nullptr;
+  sd_bus_error error = SD_BUS_ERROR_NULL;
   const int result = sd_bus_call(sd_bus_message_get_bus(request.get()), request.get(),
-                                 static_cast<std::uint64_t>(limit.count()), nullptr, &answer);
-  if (result == -ETIMEDOUT) noteTimeout(callee.process);
+                                 static_cast<std::uint64_t>(limit.count()), &error, &answer);
+  // The bus says NoReply when the callee has died, which has the same number.
+  if (result == -ETIMEDOUT && sd_bus_error_has_name(&error, SD_BUS_ERROR_NO_REPLY) == 0) {
+    noteWaitInVain(limit);
+    noteTimeout(callee.process);
+  }
+  sd_bus_error_free(&error);
   return Message(result < 0 ? nullptr : answer);
 }
 
@@ -132,20 +138,20 @@ bool send(Message request) {
   return sd_bus_send(nullptr, request.get(), nullptr) >= 0;
 }
 
+Slot callLater(Message request, sd_bus_message_handler_t take, void* context) {
+  sd_bus_slot* slot = nullptr;
+  if (request == nullptr || sd_bus_call_async(sd_bus_message_get_bus(request.get()), &slot, request.get(),
+                                              take, context, UINT64_MAX) < 0) {
+    return nullptr;
+  }
+  return Slot(slot);
+}
+
 bool nameHasOwner(const char* name) {
   const Message answer = call(kBusItself, {"/org/freedesktop/DBus", "org.freedesktop.DBus", "NameHasOwner"},
                               kQueryLimit, "s", name);
   int owned = 0;
   return answer != nullptr && sd_bus_message_read(answer.get(), "b", &owned) > 0 && owned != 0;
-}
-
-pid_t processBehind(const char* name) {
-  const Message answer =
-      call(kBusItself, {"/org/freedesktop/DBus", "org.freedesktop.DBus", "GetConnectionUnixProcessID"},
-           kQueryLimit, "s", name);
-  std::uint32_t process = 0;
-  if (answer == nullptr || sd_bus_message_read(answer.get(), "u", &process) <= 0) return 0;
-  return static_cast<pid_t>(process);
 }
 
 }  // namespace linux::system

@@ -20,6 +20,12 @@ struct MessageReleaser {
 };
 using Message = std::unique_ptr<sd_bus_message, MessageReleaser>;
 
+struct SlotReleaser {
+  void operator()(sd_bus_slot* slot) const { sd_bus_slot_unref(slot); }
+};
+/// Keeps a handler in place for as long as it lives.
+using Slot = std::unique_ptr<sd_bus_slot, SlotReleaser>;
+
 /// The connection; null while there is no session bus. Borrowed.
 sd_bus* bus();
 
@@ -30,7 +36,8 @@ void closeBus();
 /// bus) begins anew when it changes.
 unsigned busGeneration();
 
-/// Handles every message that has arrived, without waiting.
+/// Handles what has arrived, without waiting; of a flood a part, so that the loop's other sources have their
+/// turn before the rest.
 void takeInBus();
 
 /// Waits until something has come that takeInBus would handle. False when the deadline has passed first, or
@@ -60,6 +67,10 @@ Message call(const Callee& callee, Message request, Limit limit);
 /// Sends a call whose answer nobody waits for. False when it could not be queued.
 bool send(Message request);
 
+/// Sends a call whose answer, or error, takeInBus hands to `take` with this context, unless the slot has been
+/// released by then. Null when it could not be queued.
+Slot callLater(Message request, sd_bus_message_handler_t take, void* context);
+
 /// Calls with arguments as sd_bus_message_append takes them; types is their signature, "" for none.
 template <typename... Arguments>
 Message call(const Callee& callee, const Method& method, Limit limit, const char* types,
@@ -79,8 +90,5 @@ bool send(const Callee& callee, const Method& method, const char* types, Argumen
 
 /// Whether somebody owns the name now.
 bool nameHasOwner(const char* name);
-
-/// The process behind a bus name; 0 when it is not known.
-pid_t processBehind(const char* name);
 
 }  // namespace linux::system

@@ -9,6 +9,7 @@
 #include <cerrno>
 #include <map>
 
+#include "platform/linux/system/listening_sockets.h"
 #include "platform/linux/system/process.h"
 
 namespace linux::system {
@@ -52,7 +53,7 @@ std::string channelPath(const Listener& listener) {
   return sPaths[listener.process] = paths.front();
 }
 
-Channel::Channel(const Listener& listener, Limit limit) : deadline_(limit) {
+Channel::Channel(const Listener& listener, Limit limit) : limit_(patience(limit)), deadline_(limit_) {
   if (timedOutThisTurn(listener.process)) return;
   socket_ = connectTo(channelPath(listener), listener.process);
   if (socket_) return;
@@ -61,8 +62,14 @@ Channel::Channel(const Listener& listener, Limit limit) : deadline_(limit) {
 }
 
 bool Channel::waitFor(short events) {
-  timedOut_ = !base::waitFor(socket_.get(), events, deadline_);
-  return !timedOut_;
+  const bool ready = base::waitFor(socket_.get(), events, deadline_);
+  if (!ready) noteTooLate();
+  return ready;
+}
+
+void Channel::noteTooLate() {
+  if (!timedOut_) noteWaitInVain(limit_);
+  timedOut_ = true;
 }
 
 bool Channel::write(std::string_view text) {
@@ -78,8 +85,14 @@ bool Channel::write(std::string_view text) {
 }
 
 std::optional<std::string> Channel::readLine() {
-  std::size_t end = 0;
-  while ((end = received_.find('\n')) == std::string::npos) {
+  // Whoever sends without a pause is never waited for, and runs out of time all the same.
+  while (!deadline_.hasPassed()) {
+    if (const std::size_t end = received_.find('\n'); end != std::string::npos) {
+      std::string line = received_.substr(0, end);
+      received_.erase(0, end + 1);
+      if (line.ends_with('\r')) line.pop_back();
+      return line;
+    }
     std::array<char, 4096> part{};
     const ssize_t size = recv(socket_.get(), part.data(), part.size(), 0);
     if (size > 0 && received_.size() < kLongestLine) {
@@ -88,10 +101,8 @@ std::optional<std::string> Channel::readLine() {
       return std::nullopt;
     }
   }
-  std::string line = received_.substr(0, end);
-  received_.erase(0, end + 1);
-  if (line.ends_with('\r')) line.pop_back();
-  return line;
+  noteTooLate();
+  return std::nullopt;
 }
 
 }  // namespace linux::system

@@ -42,7 +42,9 @@ class Channel {
 
  private:
   bool waitFor(short events);
+  void noteTooLate();
 
+  const Limit limit_;
   const base::Deadline deadline_;
   base::FileDescriptor socket_;
   bool timedOut_ = false;

@@ -1,0 +1,72 @@
+// Who is first for a role, how long a button waits, and who talks without a pause.
+
+#include "platform/linux/programs/running.h"
+
+#include <gtest/gtest.h>
+#include <sys/socket.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <csignal>
+
+#include "platform/base/service_directory.h"
+#include "platform/linux/host/host.h"
+#include "platform/linux/system/channel.h"
+#include "tests/linux/fake_session.h"
+#include "tests/linux/fake_windows.h"
+#include "tests/temporary_directory.h"
+
+namespace {
+
+using namespace linux;
+using namespace std::chrono_literals;
+
+TEST(Running, ButtonStaysWithWhomItWasChosenFor) {
+  fake::beginSession();
+  host::init({&fake::kWindows});
+  fake::startProgram("one", "one", {"owns=org.mpris.MediaPlayer2.strawberry", "playing"});
+  fake::startProgram("two", "two", {"owns=org.mpris.MediaPlayer2.rhythmbox"});
+  programs::takeInDesktop();
+  const auto chosen = programs::firstInstance(programs::Role::Jukebox)->serialNumber;
+  EXPECT_EQ(chosen.low, static_cast<std::uint32_t>(fake::program("one").process));
+  fake::tellProgram("one", "stopped");
+  fake::tellProgram("two", "playing");
+  programs::takeInDesktop();
+  EXPECT_EQ(programs::firstInstance(programs::Role::Jukebox)->serialNumber, chosen);
+  EXPECT_NE(programs::rankedInstances(programs::Role::Jukebox).front()->serialNumber, chosen);
+  host::finish();
+  fake::endSession();
+}
+
+TEST(Turn, LosesItsPatienceAfterASecond) {
+  EXPECT_EQ(system::patience(500ms), 500ms);
+  system::noteWaitInVain(500ms);
+  EXPECT_EQ(system::patience(500ms), 500ms);
+  system::noteWaitInVain(500ms);
+  EXPECT_EQ(system::patience(500ms), 20ms);
+  EXPECT_EQ(system::patience(10ms), 10ms);
+}
+
+TEST(Channel, EndsInTimeThoughTheOtherSideNeverPauses) {
+  const TemporaryDirectory directory;
+  const auto address = base::serviceAddress(directory.path, "channel");
+  const base::FileDescriptor listening(socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0));
+  ASSERT_EQ(bind(listening.get(), reinterpret_cast<const sockaddr*>(&*address), sizeof *address), 0);
+  ASSERT_EQ(listen(listening.get(), 1), 0);
+  const pid_t talker = fork();
+  if (talker == 0) {
+    const int client = accept(listening.get(), nullptr, nullptr);
+    while (send(client, "more\n", 5, MSG_NOSIGNAL) > 0) {
+    }
+    _exit(0);
+  }
+  system::Channel channel({getpid(), "linux_test"}, 50ms);
+  EXPECT_TRUE(channel.isOpen());
+  while (channel.readLine()) {
+  }
+  EXPECT_TRUE(channel.timedOut());
+  kill(talker, SIGKILL);
+  waitpid(talker, nullptr, 0);
+}
+
+}  // namespace
