@@ -26,6 +26,10 @@ def volume_goes_by_five_within_its_limits(desktop):
     desktop.read("pactl", "set-sink-mute", "@DEFAULT_SINK@", "1")
     desktop.press("volume-up")
     wait(lambda: not desktop.muted() and desktop.volume() == 5, "volume up unmutes")
+    desktop.volume(140)
+    for button in ("volume-up", "volume-down"):
+        desktop.press(button)
+    wait(lambda: desktop.volume() == 135, "louder leaves alone what is amplified")
     desktop.channels(20, 50)
     for button, ends in (("volume-up", [22, 55]), ("volume-down", [20, 50])):
         desktop.press(button)

@@ -1,4 +1,4 @@
-// Who is first for a role, how long a button waits, and who talks without a pause.
+// Who is first for a role, how far a sound key goes, how long a button waits, and who talks without a pause.
 
 #include "platform/linux/programs/running.h"
 
@@ -11,6 +11,7 @@
 
 #include "platform/base/service_directory.h"
 #include "platform/linux/host/host.h"
+#include "platform/linux/sound/sound_keys.h"
 #include "platform/linux/system/channel.h"
 #include "tests/linux/fake_session.h"
 #include "tests/linux/fake_windows.h"
@@ -36,6 +37,18 @@ TEST(Running, ButtonStaysWithWhomItWasChosenFor) {
   EXPECT_NE(programs::rankedInstances(programs::Role::Jukebox).front()->serialNumber, chosen);
   host::finish();
   fake::endSession();
+}
+
+TEST(SoundKeys, StepWithinTheirLimits) {
+  const struct {
+    bool louder, repeated;
+    int before, after;
+  } cases[] = {{true, false, 50, 55},  {true, true, 50, 52},    {true, false, 97, 100},
+               {true, true, 99, 100},  {true, false, 140, 140}, {false, false, 140, 135},
+               {false, true, 101, 99}, {false, false, 3, 0}};
+  for (const auto& [louder, repeated, before, after] : cases) {
+    EXPECT_EQ(sound::volumeAfter({louder, true, repeated}, before), after) << before << louder << repeated;
+  }
 }
 
 TEST(Turn, LosesItsPatienceAfterASecond) {

@@ -1,5 +1,7 @@
 #include "platform/linux/roles/additions.h"
 
+#include <algorithm>
+
 #include "platform/linux/sound/sound.h"
 #include "platform/scripting/additions_dictionary.h"
 
@@ -11,6 +13,9 @@ namespace words = scripting::additions;
 using tarnscript::Code;
 using tarnscript::ObjectRef;
 using tarnscript::Value;
+
+/// In the words of scripts, for which what is amplified is at its top.
+constexpr int kFullVolume = 100;
 
 [[noreturn]] void refuse() { throw tarnscript::Refusal{"this is no command of the desktop"}; }
 
@@ -36,11 +41,11 @@ class Additions final : public tarnscript::Application {
 Value volumeSettings() {
   const auto state = sound::soundState();
   require(state.has_value());
-  return words::volumeSettings(state->volume, state->muted);
+  return words::volumeSettings(std::min(state->volume, kFullVolume), state->muted);
 }
 
 void setVolume(const words::VolumeChange& change) {
-  if (change.volume) require(sound::setOutputVolume(*change.volume));
+  if (change.volume) require(sound::setOutputVolume(std::clamp(*change.volume, 0, kFullVolume)));
   if (change.muted) require(sound::setOutputMuted(*change.muted));
 }
 

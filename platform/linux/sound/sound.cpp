@@ -136,13 +136,13 @@ std::optional<Sink> defaultSink(const Deadline& deadline) {
 // ---- Volume
 
 int toPercent(pa_volume_t volume) {
-  const auto percent = (std::uint64_t{volume} * kFullVolume + PA_VOLUME_NORM / 2) / PA_VOLUME_NORM;
-  return static_cast<int>(std::min<std::uint64_t>(percent, kFullVolume));
+  return static_cast<int>((std::uint64_t{volume} * kFullVolume + PA_VOLUME_NORM / 2) / PA_VOLUME_NORM);
 }
 
 pa_volume_t fromPercent(int percent) {
-  const auto held = static_cast<pa_volume_t>(std::clamp(percent, 0, kFullVolume));
-  return (held * PA_VOLUME_NORM + kFullVolume / 2) / kFullVolume;
+  const std::uint64_t scaled = static_cast<std::uint64_t>(std::max(percent, 0)) * PA_VOLUME_NORM;
+  return static_cast<pa_volume_t>(
+      std::min<std::uint64_t>((scaled + kFullVolume / 2) / kFullVolume, PA_VOLUME_MAX));
 }
 
 /// The channels with the loudest of them at `loudest`. Silence has no proportions: those that the sink had

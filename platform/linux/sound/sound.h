@@ -10,7 +10,7 @@
 namespace linux::sound {
 
 struct SoundState {
-  /// The loudest channel, in percent as volume sliders show it, 0 to 100. What is amplified reads as 100.
+  /// The loudest channel, in percent as volume sliders show it: from 0, and above 100 where it is amplified.
   int volume = 0;
   bool muted = false;
 };
@@ -21,8 +21,8 @@ void finish();
 /// The default sink's; nothing without a server, without a sink, or when no answer comes in time.
 std::optional<SoundState> soundState();
 
-/// Sets the loudest channel of the default sink in percent, held within 0 and 100; the other channels keep
-/// their proportion to it. False where soundState would be nothing.
+/// Sets the loudest channel of the default sink in percent; the other channels keep their proportion to it.
+/// False where soundState would be nothing.
 bool setOutputVolume(int percent);
 
 /// Mutes or unmutes the default sink. False where soundState would be nothing.

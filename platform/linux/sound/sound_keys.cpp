@@ -10,7 +10,11 @@ namespace linux::sound {
 
 namespace {
 
-constexpr int kStep = 5;  // points of the volume in percent
+// Points of the volume in percent. A held key is repeated ten times a second: it must be possible to stop it
+// where one wants.
+constexpr int kStep = 5;
+constexpr int kRepeatedStep = 2;
+constexpr int kFullVolume = 100;
 
 const char* iconOf(const SoundState& sound) {
   if (sound.muted || sound.volume == 0) return "audio-volume-muted-symbolic";
@@ -37,12 +41,19 @@ bool showOnPlasma(const SoundState& sound) {
 
 }  // namespace
 
+int volumeAfter(const base::SoundKey& key, int volume) {
+  const int step = key.repeated ? kRepeatedStep : kStep;
+  if (!key.louder) return std::max(volume - step, 0);
+  return std::max(volume, std::min(volume + step, kFullVolume));
+}
+
 void pressSoundKey(const base::SoundKey& key) {
   if (!key.pressed) return;
   auto sound = soundState();
   if (!sound) return;
-  sound->volume = std::clamp(sound->volume + (key.louder ? kStep : -kStep), 0, 100);
-  if (!setOutputVolume(sound->volume)) return;
+  const int volume = volumeAfter(key, sound->volume);
+  if (volume != sound->volume && !setOutputVolume(volume)) return;
+  sound->volume = volume;
   if (key.louder && sound->muted && setOutputMuted(false)) sound->muted = false;
   if (!showOnGnome(*sound)) showOnPlasma(*sound);
 }
