@@ -55,3 +55,4 @@ tell Lyrabox to play
 rhythmbox: drops=org.mpris.MediaPlayer2.rhythmbox.instance7
 tell Lyrabox to play
   fails
+wait 1s

@@ -67,6 +67,25 @@ tell Lyrabox to play
   strawberry: gone
   fails
 
+# One that nobody knows, and that does not obey Play, gets PlayPause a second later, unless somebody else plays by then.
+entry newcomer Categories=AudioVideo;Audio;Player;
+player newcomer DesktopEntry=newcomer ignores=Play
+tap play
+  newcomer: Play
+wait 2s
+  +1s  newcomer: PlayPause
+tap play
+  newcomer: Pause
+wait 1s
+player mpv title=Film
+tap play
+  newcomer: Play
+wait 0.5s
+mpv: playing
+wait 2s
+quit mpv
+quit newcomer
+
 # A track id that is none is not sent back: the bus would throw kvd out.
 player vlc url=file:///film.mkv length=1h Position=10m CanGoPrevious=false track:s=42 playing
 tap previous

@@ -186,6 +186,16 @@ PlaybackStatus statusToldBy(Player& player) {
   return *player.lastKnown;
 }
 
+bool hasMedia(Player& player) {
+  try {
+    const PlayerState state = stateOf(player);
+    return state.told != PlaybackStatus::Stopped &&
+           (!state.title.empty() || !state.url.empty() || state.length.has_value());
+  } catch (const tarnscript::Refusal&) {
+    return false;
+  }
+}
+
 std::optional<bool> fullscreenOf(Player& player) {
   const Message answer = askForAll(player, mpris::kRootInterface);
   std::optional<bool> fullscreen;

@@ -44,6 +44,9 @@ PlaybackStatus statusOf(Player& player);
 /// As it answers now, whatever its signals told, or as last known where it does not answer in time.
 PlaybackStatus statusToldBy(Player& player);
 
+/// Whether it plays or has paused something; false where it does not answer.
+bool hasMedia(Player& player);
+
 /// Of org.mpris.MediaPlayer2; nothing where the player does not tell.
 std::optional<bool> fullscreenOf(Player& player);
 

@@ -3,6 +3,7 @@
 #include <utility>
 
 #include "platform/linux/players/scan.h"
+#include "platform/linux/players/second_attempt.h"
 
 namespace linux::players {
 
@@ -16,6 +17,7 @@ constexpr double kSlowestScan = 2;
 void start(Player& player) {
   endFastPlaying(player);
   play(player);
+  if ((player.quirks & kUnknown) != 0) attemptAgain(player);
 }
 
 void standStill(Player& player) {

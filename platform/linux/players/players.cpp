@@ -36,6 +36,7 @@ std::list<Player> sPlayers;
 /// The owner of each name that players have on the bus, without the prefix. A player may have several.
 std::map<std::string, std::string> sOwners;
 bool sChanged = false;
+std::uint64_t sPlaybackChanges = 0;
 /// The connection that all this is known from.
 unsigned sGeneration = 0;
 
@@ -132,6 +133,7 @@ int takeOwnerChange(sd_bus_message* signal, void*, sd_bus_error*) {
 /// A status that comes while another one is wished for is from before the command.
 void takeStatus(Player& player, PlaybackStatus status) {
   if (player.wish && player.wish->status != status && !player.wish->until.hasPassed()) return;
+  if (player.status != status && player.lastKnown != status) ++sPlaybackChanges;
   if (status == PlaybackStatus::Playing && player.status != status) player.lastPlayed = nextUse();
   player.status = player.lastKnown = status;
   player.wish.reset();
@@ -142,6 +144,8 @@ int takePropertyChange(sd_bus_message* signal, void*, sd_bus_error*) {
   Player* const player = sender != nullptr ? findPlayer(sender) : nullptr;
   const char* interface = nullptr;
   if (player == nullptr || sd_bus_message_read(signal, "s", &interface) <= 0) return 0;
+  // It may have got something to play, or have nothing any more.
+  if ((player->quirks & kNeedsMedia) != 0) sChanged = true;
   readDictionary(signal, [&](std::string_view key, std::string_view type) {
     if (key != mpris::kPlaybackStatus) return;
     if (const auto status = mpris::statusNamed(readText(signal, type).value_or(""))) {
@@ -243,6 +247,8 @@ std::uint64_t nextUse() {
   return ++last;
 }
 
+std::uint64_t playbackChanges() { return sPlaybackChanges; }
+
 std::list<Player>& list() { return sPlayers; }
 
 Player* findPlayer(std::string_view owner) {
@@ -261,6 +267,7 @@ std::optional<PlaybackStatus> believedStatus(const Player& player) {
 }
 
 void believe(Player& player, PlaybackStatus status) {
+  ++sPlaybackChanges;
   player.status.reset();
   player.lastKnown = status;
   player.wish = Wish{status, base::Deadline(kAnswering)};

@@ -60,8 +60,8 @@ struct Player {
 /// Counts, from 1, what is done to players and by them, so that the later of two can be told.
 std::uint64_t nextUse();
 
-/// Takes in what the bus has sent. True when players came or went since the last call, or told their desktop
-/// entry. Waits for that once, for each player that has come.
+/// Takes in what the bus has sent. True when players came or went since the last call, told their desktop
+/// entry, or (browsers) something of what they play. Waits once for each player that has come, for its entry.
 bool takeInPlayers();
 
 /// In the order in which they came to the bus. Addresses stay valid while a player is on the bus.
@@ -69,6 +69,9 @@ std::list<Player>& list();
 
 /// The player with this unique name; null when it has left.
 Player* findPlayer(std::string_view owner);
+
+/// Counts the commands to players and what they began or ended by themselves.
+std::uint64_t playbackChanges();
 
 /// What a command of a moment ago leads to; nothing when there was none.
 std::optional<PlaybackStatus> believedCommand(const Player& player);

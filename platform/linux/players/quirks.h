@@ -13,6 +13,12 @@ enum Quirk : std::uint8_t {
   kIgnoresRaise = 2,
   /// Play does nothing when it stands still; PlayPause plays.
   kIgnoresPlay = 4,
+  /// Nobody knows what it is like.
+  kUnknown = 8,
+  /// A browser: it is a player for as long as a page has something to play.
+  kNeedsMedia = 16,
+  /// An extension that speaks for a browser, which may speak for itself too.
+  kSpeaksForBrowser = 32,
 };
 using Quirks = std::uint8_t;
 

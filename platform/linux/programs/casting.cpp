@@ -14,9 +14,9 @@ Casting decide(const Entry* entry, const Program* program, bool bystander) {
   } else if (program != nullptr) {
     casting.entry = program->entry;
   }
-  const bool castByPerson = entry != nullptr && entry->cast;
-  if (bystander && !castByPerson) return casting;
-  if (program != nullptr && !castByPerson) {
+  casting.byEntry = entry != nullptr && entry->cast;
+  if (bystander && !casting.byEntry) return casting;
+  if (program != nullptr && !casting.byEntry) {
     casting.role = program->role;
   } else if (entry != nullptr) {
     casting.role = entry->role;
@@ -29,11 +29,11 @@ Casting decide(const Entry* entry, const Program* program, bool bystander) {
 }  // namespace
 
 Casting castPlayer(std::string_view desktopEntry, std::string_view busName) {
-  const Entry* const entry = entryByID(desktopEntry);
+  const Entry* entry = entryByID(desktopEntry);
   const Program* program = programByBusName(busName);
   if (program == nullptr) program = programByEntry(desktopEntry);
-  if (entry != nullptr || program == nullptr) return decide(entry, program, isBystander(busName));
-  return decide(entryByID(program->entry), program, isBystander(busName));
+  if (entry == nullptr && program != nullptr) entry = entryByID(program->entry);
+  return decide(entry, program, isBystander(busName));
 }
 
 Casting castWindow(const windows::Window& window) {
@@ -45,7 +45,8 @@ Casting castWindow(const windows::Window& window) {
   }
   if (program == nullptr && entry != nullptr) program = programByEntry(entry->id);
   if (entry == nullptr && program != nullptr) entry = entryByID(program->entry);
-  return decide(entry, program, false);
+  const bool browser = program != nullptr && (program->quirks & players::kNeedsMedia) != 0;
+  return decide(entry, program, browser);
 }
 
 }  // namespace linux::programs

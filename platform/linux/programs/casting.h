@@ -14,6 +14,8 @@ struct Casting {
   Role role = Role::None;
   /// Null for a program that is not in the table.
   const Program* program = nullptr;
+  /// The person or packager has written the role into the desktop entry.
+  bool byEntry = false;
   /// The desktop entry without ".desktop"; empty where none was found.
   std::string entry;
 };
@@ -21,7 +23,8 @@ struct Casting {
 /// The role of a player on the bus, by the entry that it names and its bus name after the common prefix.
 Casting castPlayer(std::string_view desktopEntry, std::string_view busName);
 
-/// The role of a window, by its application id and both parts of its class.
+/// The role of a window, by its application id and both parts of its class. A browser's window alone has
+/// none.
 Casting castWindow(const windows::Window& window);
 
 }  // namespace linux::programs

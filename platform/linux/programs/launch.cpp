@@ -34,7 +34,12 @@ const Entry* installed(const Program& program) {
   return entry != nullptr && entry->role == program.role ? entry : nullptr;
 }
 
-bool canBeStarted(const Entry& entry) { return entry.busActivatable || !entry.command.empty(); }
+/// A browser that has just been started has nothing to play.
+bool canBeStarted(const Entry& entry) {
+  const Program* const program = programByEntry(entry.id);
+  const bool browser = program != nullptr && (program->quirks & players::kNeedsMedia) != 0;
+  return (!browser || entry.cast) && (entry.busActivatable || !entry.command.empty());
+}
 
 const Entry* defaultEntry(Role role) {
   if (role == Role::Jukebox) {

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <functional>
 #include <map>
+#include <set>
 #include <span>
 #include <string_view>
 #include <tuple>
@@ -59,13 +60,35 @@ Instance instanceOf(Casting casting) {
 void addPlayers(std::vector<Instance>& found) {
   for (Player& player : players::list()) {
     const Program* const known = programByBusName(player.name);
-    player.quirks = known != nullptr ? known->quirks : players::Quirks{players::kNoQuirk};
+    player.quirks = known != nullptr ? known->quirks : players::Quirks{players::kUnknown};
     Casting casting = castPlayer(player.desktopEntry, player.name);
     if (casting.role == Role::None) continue;
+    if ((player.quirks & players::kNeedsMedia) != 0 && !casting.byEntry && !hasMedia(player)) continue;
     Instance& instance = found.emplace_back(instanceOf(std::move(casting)));
     instance.process = player.callee.process;
     instance.owner = player.callee.name;
   }
+}
+
+/// The browser behind an instance, by its bus name; an empty one where the instance is none.
+std::string_view browserOf(const Instance& instance) {
+  const Program* const program = programByEntry(instance.entry);
+  return program != nullptr && (program->quirks & players::kNeedsMedia) != 0 ? program->busName : "";
+}
+
+/// A browser and the extension that speaks for it are one player: the browser speaks for itself where it can.
+void dropExtensions(std::vector<Instance>& found) {
+  const auto isExtension = [](const Instance& instance) {
+    const Player* const player = playerOf(instance);
+    return player != nullptr && (player->quirks & players::kSpeaksForBrowser) != 0;
+  };
+  std::set<std::string_view> speaking;
+  for (const Instance& instance : found) {
+    if (!isExtension(instance)) speaking.insert(browserOf(instance));
+  }
+  std::erase_if(found, [&](const Instance& instance) {
+    return isExtension(instance) && speaking.contains(browserOf(instance));
+  });
 }
 
 /// Whom a window belongs to although no process says so, by their desktop entry: a player that speaks on the
@@ -86,8 +109,8 @@ void addPrograms(std::vector<Instance>& found) {
       continue;
     }
     Casting casting = castWindow(window);
-    if (casting.role == Role::None) continue;
     Instance* owner = ownerByEntry(found, window, casting);
+    if (owner == nullptr && casting.role == Role::None) continue;
     if (owner == nullptr) owner = &found.emplace_back(instanceOf(std::move(casting)));
     if (window.process != 0) {
       owner->process = window.process;
@@ -179,6 +202,7 @@ void takeInDesktop() {
   if (!playersChanged && !windowsChanged && !classesChanged) return;
   std::vector<Instance> found;
   addPlayers(found);
+  dropExtensions(found);
   addPrograms(found);
   addWindows(found);
   for (Instance& instance : found) {

@@ -19,12 +19,16 @@ using players::ChannelKind;
 using players::kIgnoresPlay;
 using players::kIgnoresRaise;
 using players::kIgnoresRate;
+using players::kNeedsMedia;
+using players::kSpeaksForBrowser;
 
 namespace lyrabox = scripting::lyrabox;
 namespace movies = scripting::movies;
 namespace slidewell = scripting::slidewell;
 namespace snapvale = scripting::snapvale;
 namespace spindle = scripting::spindle;
+
+constexpr players::Quirks kBrowser = kNeedsMedia | kIgnoresRate;
 
 // Within a role the first that is installed is the default.
 // One program a row, its actions one a line below it.
@@ -82,6 +86,17 @@ constexpr Program kPrograms[] = {
     {.role = Role::ModernMovies, .name = "Showtime", .entry = "org.gnome.Showtime", .busName = "Showtime", .windowClass = "org.gnome.Showtime"},
     {.role = Role::ModernMovies, .name = "Dragon Player", .entry = "org.kde.dragonplayer", .busName = "dragonplayer", .windowClass = "dragonplayer"},
     {.role = Role::ModernMovies, .name = "Parole", .entry = "org.xfce.Parole", .busName = "parole", .windowClass = "parole"},
+    // Browsers. Stop would take what they play away.
+    {.role = Role::ModernMovies, .name = "Firefox", .entry = "firefox", .busName = "firefox", .windowClass = "firefox", .quirks = kBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
+    {.role = Role::ModernMovies, .name = "Firefox ESR", .entry = "firefox-esr", .busName = "firefox", .windowClass = "firefox-esr", .quirks = kBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
+    {.role = Role::ModernMovies, .name = "Chromium", .entry = "chromium", .busName = "chromium", .windowClass = "chromium", .quirks = kBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
+    {.role = Role::ModernMovies, .name = "Chrome", .entry = "google-chrome", .busName = "chrome", .windowClass = "google-chrome", .quirks = kBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
+    {.role = Role::ModernMovies, .name = "Brave", .entry = "brave-browser", .busName = "brave", .windowClass = "brave-browser", .quirks = kBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
+    {.role = Role::ModernMovies, .name = "Vivaldi", .entry = "vivaldi-stable", .busName = "vivaldi", .windowClass = "vivaldi-stable", .quirks = kBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
+    {.role = Role::ModernMovies, .name = "Opera", .entry = "opera", .busName = "opera", .windowClass = "opera", .quirks = kBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
+    {.role = Role::ModernMovies, .name = "Edge", .entry = "microsoft-edge", .busName = "edge", .windowClass = "microsoft-edge", .quirks = kBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
+    {.role = Role::ModernMovies, .name = "Web", .entry = "org.gnome.Epiphany", .busName = "org.gnome.Epiphany", .windowClass = "epiphany", .quirks = kBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
+    {.role = Role::ModernMovies, .name = "Plasma Browser Integration", .busName = "plasma-browser-integration", .quirks = kBrowser | kSpeaksForBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
 
     {.role = Role::Presentation, .name = "LibreOffice Impress", .entry = "libreoffice-impress", .windowClass = "libreoffice-impress", .show = ShowStyle::OwnWindow, .suite = "libreoffice"},
     {.role = Role::Presentation, .name = "Evince", .entry = "org.gnome.Evince", .windowClass = "evince",
@@ -182,16 +197,6 @@ constexpr Action kPhotoLibrary[] = {
 /// Beginnings of bus names, after the prefix of all players.
 constexpr std::string_view kBystanders[] = {
     "playerctld",
-    "firefox",
-    "chromium",
-    "chrome",
-    "brave",
-    "vivaldi",
-    "opera",
-    "epiphany",
-    "org.gnome.Epiphany",
-    "edge",
-    "plasma-browser-integration",
     "kdeconnect",
 };
 

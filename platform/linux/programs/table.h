@@ -75,7 +75,7 @@ const Program* programByWindowClass(std::string_view windowClass);
 bool isOfSuite(std::string_view windowClass);
 
 /// Whether what owns this bus name plays no role whatever its entry says: proxies that speak for other
-/// players, browsers, headsets.
+/// players, headsets.
 bool isBystander(std::string_view busName);
 
 /// What every program of the role does that has no action of its own for the word.

@@ -1,0 +1,40 @@
+# A browser is a player while a page has something to play.
+entry firefox-esr Categories=Network;WebBrowser;
+player strawberry
+player firefox as=firefox.instance_1_6 DesktopEntry=firefox-esr stopped
+window Page of firefox class=firefox-esr
+front Page
+start
+tap play
+  strawberry: PlayPause
+firefox: title=Film playing
+tap play
+  strawberry: Pause
+  firefox: Pause
+tap play
+  firefox: Play
+tell VistremePlayerX to close front document
+  firefox: Pause
+firefox: stopped
+tap play
+  strawberry: PlayPause
+# The extension that speaks for it is heard where it does not speak for itself; its window is the browser's.
+firefox: playing
+player extension as=plasma-browser-integration DesktopEntry=firefox-esr title=Film
+tap play
+  strawberry: Pause
+  firefox: Pause
+firefox: drops=org.mpris.MediaPlayer2.firefox.instance_1_6
+tap play
+  extension: Play
+quit extension
+firefox: owns=org.mpris.MediaPlayer2.firefox.instance_1_6 playing
+# None is started to play films, and one whose entry says so is none.
+entry org.gnome.Epiphany DBusActivatable=true
+program web owns=org.gnome.Epiphany
+quit firefox
+tell VistremePlayerX to launch
+entry chromium X-Kvd-Application=none
+player chromium as=chromium.instance4711 title=Film playing
+tap play
+  strawberry: PlayPause
