@@ -37,3 +37,4 @@ tap play
 newcomer: obeys=GetAll
 tap play
   newcomer: Play
+wait 1s
