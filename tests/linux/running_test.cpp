@@ -12,6 +12,7 @@
 #include "platform/base/service_directory.h"
 #include "platform/linux/host/host.h"
 #include "platform/linux/sound/sound_keys.h"
+#include "platform/linux/system/bus.h"
 #include "platform/linux/system/channel.h"
 #include "tests/linux/fake_session.h"
 #include "tests/linux/fake_windows.h"
@@ -49,6 +50,27 @@ TEST(SoundKeys, StepWithinTheirLimits) {
   for (const auto& [louder, repeated, before, after] : cases) {
     EXPECT_EQ(sound::volumeAfter({louder, true, repeated}, before), after) << before << louder << repeated;
   }
+}
+
+TEST(Bus, AFloodIsTakenInByParts) {
+  constexpr int kSignals = 1000;
+  fake::beginSession();
+  int taken = 0;
+  const auto count = [](sd_bus_message*, void* context, sd_bus_error*) {
+    return ++*static_cast<int*>(context), 0;
+  };
+  sd_bus_add_match(system::bus(), nullptr, "type='signal',interface='test.Flood'", count, &taken);
+  sd_bus* flood = nullptr;
+  sd_bus_open_user(&flood);
+  for (int i = 0; i < kSignals; ++i) sd_bus_emit_signal(flood, "/flood", "test.Flood", "More", "");
+  sd_bus_flush_close_unref(flood);
+  for (int before = 0; taken < kSignals; before = taken) {
+    system::waitForBus(base::Deadline(1min));
+    system::takeInBus();
+    EXPECT_LE(taken - before, 256);
+  }
+  system::closeBus();
+  fake::endSession();
 }
 
 TEST(Turn, LosesItsPatienceAfterASecond) {

@@ -18,6 +18,7 @@
 #include "platform/base/deadline.h"
 #include "platform/base/file_descriptor.h"
 #include "platform/base/run_loop.h"
+#include "platform/host.h"
 #include "platform/linux/system/turn.h"
 #include "platform/linux/windows/x11/display.h"
 
@@ -47,7 +48,13 @@ constexpr std::array<const char*, kAtomCount> kAtomNames = {
 /// Properties of the root window that tell of the windows.
 constexpr Atom kWatched[] = {NetActiveWindow, NetClientList, NetClientListStacking};
 
+/// Events that are taken in at a time: of a flood a part, so that the loop's other sources have their turn.
+constexpr int kMostEvents = 256;
+
 xcb_connection_t* sConnection = nullptr;
+base::Owned<base::Source> sSource;
+/// There may be events that xcb has read already: they do not show on the descriptor.
+bool sHasMore = false;
 Changes sChanges;
 /// The server has let a wait run out: it counts as gone.
 bool sHangs = false;
@@ -57,6 +64,10 @@ xcb_window_t sRoot = XCB_NONE;
 std::array<xcb_atom_t, kAtomCount> sAtoms{};
 
 void loseConnection() {
+  if (sSource != nullptr) {
+    HostRunLoopRemoveSource(HostRunLoopCurrent(), HostSourceRef(sSource.get()), HostRunLoopMode::Default);
+    sSource.reset();
+  }
   if (sConnection != nullptr) xcb_disconnect(sConnection);
   sConnection = nullptr;
   sHangs = false;
@@ -116,22 +127,12 @@ bool introduce() {
   return isHealthy();
 }
 
-bool connectToDisplay() {
-  if (std::getenv("DISPLAY") == nullptr || !serverAnswers()) return false;
-  int screen = 0;
-  sConnection = xcb_connect(nullptr, &screen);
-  sRoot = isHealthy() ? rootOf(sConnection, screen) : XCB_NONE;
-  if (sRoot != XCB_NONE && introduce()) {
-    ++sChanges.windows;
-    ++sChanges.keyboard;
-    return true;
-  }
-  loseConnection();
-  return false;
-}
-
 void takeInEvents() {
-  while (const Owned<xcb_generic_event_t> event{xcb_poll_for_event(sConnection)}) {
+  int taken = 0;
+  while (taken < kMostEvents) {
+    const Owned<xcb_generic_event_t> event{xcb_poll_for_event(sConnection)};
+    if (event == nullptr) break;
+    ++taken;
     const int type = event->response_type & 0x7F;  // the highest bit says that a program sent it
     if (type == XCB_MAPPING_NOTIFY) ++sChanges.keyboard;
     if (type != XCB_PROPERTY_NOTIFY) continue;
@@ -140,7 +141,31 @@ void takeInEvents() {
                                        [&](Atom watched) { return changed == atom(watched); });
     if (ofWindows) ++sChanges.windows;
   }
+  sHasMore = taken == kMostEvents;
   if (!isHealthy()) loseConnection();
+}
+
+void putOnLoop() {
+  sHasMore = true;
+  sSource =
+      base::Owned<base::Source>(new base::Source(xcb_get_file_descriptor(sConnection), 0, takeInEvents));
+  sSource->prepare = [] { return sHasMore; };
+  HostRunLoopAddSource(HostRunLoopCurrent(), HostSourceRef(sSource.get()), HostRunLoopMode::Default);
+}
+
+bool connectToDisplay() {
+  if (std::getenv("DISPLAY") == nullptr || !serverAnswers()) return false;
+  int screen = 0;
+  sConnection = xcb_connect(nullptr, &screen);
+  sRoot = isHealthy() ? rootOf(sConnection, screen) : XCB_NONE;
+  if (sRoot != XCB_NONE && introduce()) {
+    putOnLoop();
+    ++sChanges.windows;
+    ++sChanges.keyboard;
+    return true;
+  }
+  loseConnection();
+  return false;
 }
 
 }  // namespace

@@ -1,9 +1,8 @@
 // The connection to the X server: made, lost and made again, and never waited for longer than a question may
 // take.
 //
-// It is not on the run loop. What has changed is told by events that wait in the socket until somebody takes
-// them in, so that a desktop in use does not wake an idle kvd; they are few, as only the root window's
-// properties are watched.
+// It is on the run loop, for the sake of the server, which keeps what nobody reads. What has changed is told by
+// events; they are few, as only the root window's properties are watched.
 #pragma once
 
 #include <xcb/xcb.h>
