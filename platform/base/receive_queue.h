@@ -16,7 +16,7 @@ namespace base {
 /// A message as it came off the socket.
 struct Datagram {
   std::vector<std::byte> bytes;
-  /// Sent by this user, and arrived whole.
+  /// Sent by this user or by root, and arrived whole.
   bool trusted = false;
   /// The process that sent it; 0 where that is unknown.
   pid_t sender = 0;

@@ -1,6 +1,7 @@
 // The sending side of a port: look it up, put messages into its queue.
 #include <poll.h>
 #include <sys/socket.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <algorithm>
@@ -11,6 +12,7 @@
 #include <limits>
 #include <optional>
 
+#include "platform/base/failure.h"
 #include "platform/base/port_names.h"
 #include "platform/base/service_directory.h"
 #include "platform/base/sockets.h"
@@ -66,16 +68,32 @@ bool waitForRoom(int socket, std::optional<Clock::time_point> deadline) {
   return true;
 }
 
+/// Whether something else is in the socket's place: no socket, or one that is not the directory's owner's.
+/// What reads from a datagram socket does not tell who it is.
+bool isForeign(const sockaddr_un& address, const std::string& directory) {
+  struct stat place {};
+  struct stat there {};
+  if (lstat(address.sun_path, &there) != 0 || stat(directory.c_str(), &place) != 0) return false;
+  return !S_ISSOCK(there.st_mode) || there.st_uid != place.st_uid;
+}
+
+kern_return_t nobodyThere(const std::string& line) {
+  base::noteFailure(line);
+  return BOOTSTRAP_UNKNOWN_SERVICE;
+}
+
 }  // namespace
 
 kern_return_t bootstrap_look_up(mach_port_t bootstrap, const char* service, mach_port_t* port) {
   if (bootstrap != base::kBootstrapPort || service == nullptr || port == nullptr)
     return KERN_INVALID_ARGUMENT;
-  const auto directory = base::serviceDirectory(false);
+  const auto directory = base::serviceDirectory(base::Side::Sends);
   const auto address = directory ? base::serviceAddress(*directory, service) : std::nullopt;
   if (!address) return BOOTSTRAP_UNKNOWN_SERVICE;
+  const std::string path = address->sun_path;
+  if (isForeign(*address, *directory)) return nobodyThere(path + " is not the socket of a kvd; remove it");
   base::FileDescriptor socket = base::connectedSocket(*address);
-  if (!socket) return BOOTSTRAP_UNKNOWN_SERVICE;
+  if (!socket) return nobodyThere("nobody is listening on " + path);
   *port = base::portName(service);
   base::setSendSocket(*port, std::move(socket));
   return KERN_SUCCESS;

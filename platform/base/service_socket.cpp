@@ -8,9 +8,11 @@
 
 #include <cerrno>
 #include <cstdlib>
+#include <cstring>
 #include <string>
 #include <vector>
 
+#include "platform/base/failure.h"
 #include "platform/base/service_directory.h"
 #include "platform/base/sockets.h"
 
@@ -19,7 +21,6 @@ namespace {
 
 /// A socket file that this process made.
 struct BoundFile {
-  std::string directory;
   std::string path;
   dev_t device;
   ino_t inode;
@@ -33,18 +34,17 @@ std::vector<BoundFile>& boundFiles() {
 }
 
 /// The directory, locked while the descriptor is open: nobody else is between test, removal and bind then.
+/// None where somebody else has it; who may only read a directory may keep it locked for ever.
 FileDescriptor lockDirectory(const std::string& directory) {
   FileDescriptor lock(open(directory.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
-  while (lock && flock(lock.get(), LOCK_EX) != 0) {
-    if (errno != EINTR) return FileDescriptor();
-  }
+  if (lock && flock(lock.get(), LOCK_EX | LOCK_NB) != 0) return FileDescriptor();
   return lock;
 }
 
+/// Needs no lock: while this process lives its socket answers, and nobody else takes the place.
 void removeBoundFiles() {
   for (const BoundFile& file : boundFiles()) {
     if (file.maker != getpid()) continue;
-    const FileDescriptor lock = lockDirectory(file.directory);
     struct stat now {};
     if (lstat(file.path.c_str(), &now) != 0) continue;
     if (now.st_dev == file.device && now.st_ino == file.inode) unlink(file.path.c_str());
@@ -55,9 +55,17 @@ void removeBoundFiles() {
 kern_return_t clearPath(const sockaddr_un& address) {
   struct stat there {};
   if (lstat(address.sun_path, &there) != 0) return errno == ENOENT ? KERN_SUCCESS : KERN_FAILURE;
-  if (!S_ISSOCK(there.st_mode)) return KERN_FAILURE;
+  if (!S_ISSOCK(there.st_mode)) {
+    errno = EEXIST;
+    return KERN_FAILURE;
+  }
   if (connectedSocket(address)) return BOOTSTRAP_SERVICE_ACTIVE;
   return errno == ECONNREFUSED && unlink(address.sun_path) == 0 ? KERN_SUCCESS : KERN_FAILURE;
+}
+
+kern_return_t cannotBind(const std::string& path) {
+  noteFailure("cannot make the socket " + path + ": " + std::strerror(errno));
+  return KERN_FAILURE;
 }
 
 /// Binds with a mode that lets only the owner reach the socket.
@@ -71,20 +79,31 @@ bool bindPrivately(int socket, const sockaddr_un& address) {
 }  // namespace
 
 kern_return_t bindServiceSocket(std::string_view service, FileDescriptor& bound) {
-  const auto directory = serviceDirectory(true);
+  const auto directory = serviceDirectory(Side::Receives);
   const auto address = directory ? serviceAddress(*directory, service) : std::nullopt;
   if (!address) return KERN_FAILURE;
+  const std::string path = address->sun_path;
   const FileDescriptor lock = lockDirectory(*directory);
+  if (!lock) {
+    noteFailure("cannot lock " + *directory + ": " + std::strerror(errno) +
+                "; if another kvd is starting there, try again");
+    return KERN_FAILURE;
+  }
   FileDescriptor socket = datagramSocket();
-  if (!lock || !socket) return KERN_FAILURE;
-  if (const kern_return_t cleared = clearPath(*address); cleared != KERN_SUCCESS) return cleared;
+  if (!socket) return cannotBind(path);
+  const kern_return_t cleared = clearPath(*address);
+  if (cleared == BOOTSTRAP_SERVICE_ACTIVE) {
+    noteFailure("another kvd listens on " + path + "; 'kvremote quit' ends it");
+    return cleared;
+  }
+  if (cleared != KERN_SUCCESS) return cannotBind(path);
 
   // Registered first: where no handler can be had, no file is left behind.
   static const bool removedAtExit = std::atexit(removeBoundFiles) == 0;
   struct stat made {};
-  if (!removedAtExit || !bindPrivately(socket.get(), *address)) return KERN_FAILURE;
-  if (lstat(address->sun_path, &made) != 0) return KERN_FAILURE;
-  boundFiles().push_back({*directory, address->sun_path, made.st_dev, made.st_ino, getpid()});
+  if (!removedAtExit || !bindPrivately(socket.get(), *address)) return cannotBind(path);
+  if (lstat(path.c_str(), &made) != 0) return cannotBind(path);
+  boundFiles().push_back({path, made.st_dev, made.st_ino, getpid()});
   bound = std::move(socket);
   return KERN_SUCCESS;
 }

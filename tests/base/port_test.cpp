@@ -2,6 +2,7 @@
 
 #include <fcntl.h>
 #include <gtest/gtest.h>
+#include <sys/file.h>
 #include <sys/socket.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
@@ -12,6 +13,7 @@
 #include <string>
 #include <vector>
 
+#include "platform/base/failure.h"
 #include "platform/base/port_names.h"
 #include "platform/base/run_loop.h"
 #include "platform/base/sockets.h"
@@ -21,6 +23,8 @@ namespace {
 
 constexpr char kService[] = "com.tarn.test";
 constexpr std::size_t kLargest = 48;
+constexpr uid_t kNobody = 65534;
+constexpr gid_t kSame = static_cast<gid_t>(-1);
 
 kern_return_t checkIn(mach_port_t& port, const char* service = kService) {
   return bootstrap_check_in(base::kBootstrapPort, service, &port);
@@ -152,9 +156,25 @@ TEST_F(Ports, ForeignShapesAreDroppedOrLeftToTheDecoder) {
   if (geteuid() != 0) GTEST_SKIP() << "only root can send as somebody else";
   std::filesystem::permissions(directory.path, std::filesystem::perms::all);
   std::filesystem::permissions(path, std::filesystem::perms::all);
-  const pid_t stranger = inChild([] { return setuid(65534) == 0 && sendOne(); });
+  const pid_t stranger =
+      inChild([&] { return setuid(kNobody) == 0 && write(raw.get(), bytes.data(), 24) == 24; });
   EXPECT_EQ(receiver.take(9).dropped, 5u);
   EXPECT_TRUE(succeeded(stranger));
+}
+
+TEST_F(Ports, RootReachesEverybody) {
+  if (geteuid() != 0) GTEST_SKIP() << "it takes root";
+  ASSERT_EQ(chown(directory.path.c_str(), kNobody, kSame), 0);
+  int ends[2];
+  ASSERT_EQ(pipe(ends), 0);
+  const pid_t user = inChild([&] {
+    return setuid(kNobody) == 0 && checkIn(port) == KERN_SUCCESS && write(ends[1], "x", 1) == 1 &&
+           Receiver(port).take(1).delivered == 1;
+  });
+  char byte = 0;
+  ASSERT_EQ(read(ends[0], &byte, 1), 1);
+  EXPECT_TRUE(sendOne());
+  EXPECT_TRUE(succeeded(user));
 }
 
 TEST_F(Ports, FullQueueTimesOutAndADeadReceiverEndsTheWait) {
@@ -218,9 +238,40 @@ TEST_F(Ports, SocketFileIsReplacedKeptOrRemovedAsItsOwnerLives) {
   });
   EXPECT_TRUE(succeeded(daemon) && inode() == 0);
 
+  const base::FileDescriptor holder(open(directory.path.c_str(), O_RDONLY | O_CLOEXEC));
+  ASSERT_EQ(flock(holder.get(), LOCK_EX), 0);
+  EXPECT_EQ(checkIn(port), KERN_FAILURE) << "who holds the lock is not waited for";
+  flock(holder.get(), LOCK_UN);
   std::ofstream(path) << "no socket";
   EXPECT_EQ(checkIn(port), KERN_FAILURE);
   EXPECT_EQ(std::filesystem::file_size(path), 9u);
+}
+
+TEST_F(Ports, NeitherSideTrustsWhatOthersMayHaveMade) {
+  const uid_t us = geteuid();
+  const struct {
+    mode_t mode;
+    uid_t directoryOwner;
+    uid_t socketOwner;
+    bool receives;
+    bool sends;
+  } cases[] = {
+      {0700, us, us, true, true},
+      {0755, us, us, true, true},
+      {0720, us, us, false, false},
+      {0702, us, us, false, false},
+      {0700, us, kNobody, true, false},
+      {0700, kNobody, us, false, false},
+      {0700, kNobody, kNobody, false, true},  // Only root sees these.
+  };
+  const base::FileDescriptor bound(boundSocket());
+  for (const auto& [mode, directoryOwner, socketOwner, receives, sends] : cases) {
+    if (chown(directory.path.c_str(), directoryOwner, kSame) != 0) continue;
+    if (chown(path.c_str(), socketOwner, kSame) != 0) continue;
+    ASSERT_EQ(chmod(directory.path.c_str(), mode), 0);
+    EXPECT_EQ(base::serviceDirectory(base::Side::Receives).has_value(), receives) << base::lastFailure();
+    EXPECT_EQ(lookUp(port) == KERN_SUCCESS, sends) << base::lastFailure();
+  }
 }
 
 TEST_F(Ports, PrivateDirectoryMustBeOurs) {
@@ -229,12 +280,12 @@ TEST_F(Ports, PrivateDirectoryMustBeOurs) {
   const std::string user = std::to_string(geteuid());
   if (std::filesystem::exists("/run/user/" + user)) GTEST_SKIP() << "the session has a directory";
   const std::filesystem::path own = directory.path / ("kvd-" + user);
-  EXPECT_EQ(base::serviceDirectory(true), own);
+  EXPECT_EQ(base::serviceDirectory(base::Side::Receives), own);
   std::filesystem::permissions(own, std::filesystem::perms::all);
-  EXPECT_FALSE(base::serviceDirectory(true));
+  EXPECT_FALSE(base::serviceDirectory(base::Side::Receives));
   std::filesystem::remove(own);
   std::filesystem::create_directory_symlink(directory.path, own);
-  EXPECT_FALSE(base::serviceDirectory(true));
+  EXPECT_FALSE(base::serviceDirectory(base::Side::Receives));
 }
 
 }  // namespace
