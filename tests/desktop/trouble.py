@@ -2,7 +2,7 @@
 import os
 import signal
 
-from desktop import Failed, wait
+from desktop import wait
 from music import PAUSED, PLAYING
 from programs import Mpv, Strawberry
 
@@ -82,12 +82,3 @@ def without_window_server(desktop):
     music = Strawberry(desktop)
     desktop.start_kvd(DISPLAY=None)
     music.follow(("play", PLAYING), ("play", PAUSED))
-
-
-def refuses_to_start(desktop):
-    desktop.start_kvd()
-    os.mkdir("empty", 0o700)
-    elsewhere = {"XDG_RUNTIME_DIR": "empty", "DBUS_SESSION_BUS_ADDRESS": "unix:path=empty/bus"}
-    for why, changes in (("the port is taken", {}), ("there is no bus", elsewhere)):
-        if (status := desktop.start("./kvd", env={**desktop.env, **changes}).wait(60)) != 1:
-            raise Failed(f"kvd ended with status {status}, though {why}")

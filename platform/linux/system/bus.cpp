@@ -3,8 +3,11 @@
 #include <cerrno>
 #include <chrono>
 #include <cstdint>
+#include <cstdlib>
+#include <cstring>
 #include <optional>
 
+#include "platform/base/failure.h"
 #include "platform/base/run_loop.h"
 #include "platform/host.h"
 
@@ -63,12 +66,21 @@ bool becomesReady(sd_bus* connection) {
   return sd_bus_is_ready(connection) > 0;
 }
 
+void noteNoBus(const char* why) {
+  const char* const address = std::getenv("DBUS_SESSION_BUS_ADDRESS");
+  base::noteFailure(std::string("no session bus at ") +
+                    (address != nullptr ? address : "$XDG_RUNTIME_DIR/bus") + ": " + why +
+                    "; start kvd in your session, or set DBUS_SESSION_BUS_ADDRESS");
+}
+
 void connect() {
   sd_bus* connection = nullptr;
-  if (sd_bus_open_user(&connection) < 0) return;
+  const int opened = sd_bus_open_user(&connection);
+  if (opened == -ENOMEDIUM) return noteNoBus("XDG_RUNTIME_DIR is not set");
+  if (opened < 0) return noteNoBus(std::strerror(-opened));
   if (!becomesReady(connection)) {
     sd_bus_close_unref(connection);
-    return;
+    return noteNoBus("it does not let us in");
   }
   sBus = connection;
   ++sGeneration;
