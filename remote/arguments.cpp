@@ -18,16 +18,17 @@ enum class Gesture { Tap, Press, Release, Hold, Raw };
 struct Line {
   std::optional<Gesture> gesture;
   std::chrono::milliseconds hold{0};
+  std::string user;
   Words words;
 };
 
 constexpr std::chrono::minutes kLongestHold{10};
 
 std::chrono::milliseconds parseHold(std::string_view text) {
-  const std::chrono::nanoseconds time = parseTime(text);
+  const auto time = readTime(text).value_or(std::chrono::nanoseconds(0));
   const auto milliseconds = std::chrono::round<std::chrono::milliseconds>(time);
   if (milliseconds.count() < 1 || time > kLongestHold) {
-    throw UsageError("a button can be held for 1ms to 10m, not " + inQuotes(text));
+    throw UsageError("a button can be held for 1ms to 10m (500ms, 1.5s, 1m30s), not " + inQuotes(text));
   }
   return milliseconds;
 }
@@ -59,6 +60,9 @@ Line takeApart(std::span<const char* const> arguments) {
       setGesture(line, Gesture::Hold);
       if (++index == arguments.size()) throw UsageError("--hold needs a time, such as 2s");
       line.hold = parseHold(arguments[index]);
+    } else if (word == "--user") {
+      if (++index == arguments.size()) throw UsageError("--user needs a name");
+      line.user = arguments[index];
     } else if (word.starts_with(kHoldEquals)) {
       setGesture(line, Gesture::Hold);
       line.hold = parseHold(word.substr(kHoldEquals.size()));
@@ -124,6 +128,15 @@ Arguments parseCommand(Action action, const Line& line) {
   return arguments;
 }
 
+Arguments parseLine(const Line& line) {
+  if (line.gesture == Gesture::Raw) return parseRaw(line.words);
+  if (line.words.empty()) throw UsageError("no button given (see kvremote --help)");
+  if (line.words[0] == "list") return parseCommand(Action::ListButtons, line);
+  if (line.words[0] == "lock") return parseCommand(Action::SetScreenLocked, line);
+  if (line.words[0] == "quit") return parseCommand(Action::Terminate, line);
+  return parseButton(line);
+}
+
 }  // namespace
 
 Arguments parseArguments(std::span<const char* const> words) {
@@ -132,12 +145,9 @@ Arguments parseArguments(std::span<const char* const> words) {
     if (word == "--version") return withAction(Action::ShowVersion);
   }
   const Line line = takeApart(words);
-  if (line.gesture == Gesture::Raw) return parseRaw(line.words);
-  if (line.words.empty()) throw UsageError("no button given (see kvremote --help)");
-  if (line.words[0] == "list") return parseCommand(Action::ListButtons, line);
-  if (line.words[0] == "lock") return parseCommand(Action::SetScreenLocked, line);
-  if (line.words[0] == "quit") return parseCommand(Action::Terminate, line);
-  return parseButton(line);
+  Arguments arguments = parseLine(line);
+  arguments.user = line.user;
+  return arguments;
 }
 
 }  // namespace remote

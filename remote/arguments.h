@@ -4,6 +4,7 @@
 #include <chrono>
 #include <cstdint>
 #include <span>
+#include <string>
 #include <vector>
 
 #include "remote/words.h"
@@ -23,6 +24,8 @@ struct Arguments {
   std::chrono::milliseconds hold{0};
   /// SetScreenLocked: the new state.
   bool locked = false;
+  /// Whose daemon gets the message; empty when nobody was named.
+  std::string user;
 };
 
 /// Reads a command line, without the program's name. Throws UsageError.

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <array>
-#include <numeric>
 #include <utility>
 
 #include "remote/words.h"
@@ -58,20 +57,23 @@ std::string spelling(std::string_view name) {
   return result;
 }
 
-// How many characters to insert, remove or replace to turn one text into the other (Levenshtein), by one row
-// of the table at a time.
+// How many characters to insert, remove, replace or swap with their neighbour to turn one text into the
+// other.
 std::size_t editDistance(std::string_view from, std::string_view to) {
-  std::vector<std::size_t> row(to.size() + 1);
-  std::iota(row.begin(), row.end(), std::size_t{0});
-  for (const char character : from) {
-    std::size_t diagonal = row[0]++;
-    for (std::size_t column = 1; column < row.size(); ++column) {
-      const std::size_t replaced = diagonal + (to[column - 1] == character ? 0 : 1);
-      diagonal = row[column];
-      row[column] = std::min({replaced, diagonal + 1, row[column - 1] + 1});
+  std::vector<std::vector<std::size_t>> edits(from.size() + 1, std::vector<std::size_t>(to.size() + 1));
+  for (std::size_t i = 0; i <= from.size(); ++i) {
+    for (std::size_t j = 0; j <= to.size(); ++j) {
+      if (i == 0 || j == 0) {
+        edits[i][j] = i + j;
+        continue;
+      }
+      const std::size_t replaced = edits[i - 1][j - 1] + (from[i - 1] == to[j - 1] ? 0 : 1);
+      edits[i][j] = std::min({replaced, edits[i - 1][j] + 1, edits[i][j - 1] + 1});
+      const bool swapped = i > 1 && j > 1 && from[i - 1] == to[j - 2] && from[i - 2] == to[j - 1];
+      if (swapped) edits[i][j] = std::min(edits[i][j], edits[i - 2][j - 2] + 1);
     }
   }
-  return row.back();
+  return edits.back().back();
 }
 
 // A name that was only begun is as near as one wrong letter.
@@ -101,14 +103,14 @@ const Button& knownButton(std::string_view name) {
 }
 
 std::vector<std::string> nearestButtonNames(std::string_view name) {
-  // Beyond this many edits a short name resembles every other one.
+  // One slip in three letters; beyond that, and beyond this many, a name resembles every other one.
   constexpr std::size_t kFarthest = 3;
   // Nothing so long is near a name, and the comparison takes time by its length.
   constexpr std::size_t kLongest = 32;
   if (name.size() > kLongest) return {};
 
   const std::string typed = spelling(name);
-  const std::size_t limit = std::clamp<std::size_t>(typed.size() / 2, 1, kFarthest);
+  const std::size_t limit = std::clamp<std::size_t>(typed.size() / 3, 1, kFarthest);
   std::vector<std::pair<std::size_t, std::string>> near;
   for (const Button& button : kButtons) {
     const std::string hidName = spelling(button.hidName);

@@ -8,6 +8,7 @@
 #include <ctime>
 
 #include "messages/kvd_messages.h"
+#include "platform/base/failure.h"
 #include "platform/mach.h"
 #include "remote/kvd_client.h"
 
@@ -21,8 +22,10 @@ int report(kern_return_t result) {
     case KERN_SUCCESS:
       return kSent;
     case BOOTSTRAP_UNKNOWN_SERVICE:
+      std::fprintf(stderr, "kvremote: %s\n", base::lastFailure().c_str());
+      return kNotSent;
     case MACH_SEND_INVALID_DEST:
-      std::fprintf(stderr, "kvremote: nobody is listening on %s\n", kKVDServiceName);
+      std::fprintf(stderr, "kvremote: %s has ended meanwhile\n", kKVDServiceName);
       return kNotSent;
     case MACH_SEND_TIMED_OUT:
       std::fprintf(stderr, "kvremote: the queue of %s stayed full for %u seconds\n", kKVDServiceName,

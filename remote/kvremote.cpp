@@ -7,6 +7,7 @@
 #include "remote/arguments.h"
 #include "remote/buttons.h"
 #include "remote/deliver.h"
+#include "remote/session.h"
 
 namespace {
 
@@ -27,6 +28,8 @@ Send a button of a media remote to kvd, which acts on it.
   lock on|off       say that the screen was locked or unlocked
   quit              ask kvd to quit
   list              list the buttons
+  --user NAME       send to the kvd of another user, which takes root; root without
+                    XDG_RUNTIME_DIR sends to the user at the screen anyway
   -h, --help        show this help
   --version         show the version
 
@@ -59,6 +62,7 @@ int run(const remote::Arguments& arguments) {
       listButtons();
       break;
     default:
+      remote::chooseSession(arguments.user);
       return remote::deliver(arguments);
   }
   if (std::fflush(stdout) == 0 && std::ferror(stdout) == 0) return 0;

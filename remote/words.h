@@ -5,6 +5,7 @@
 #include <chrono>
 #include <cstdint>
 #include <limits>
+#include <optional>
 #include <stdexcept>
 #include <string>
 #include <string_view>
@@ -20,8 +21,11 @@ struct UsageError : std::runtime_error {
 /// The word in single quotes.
 std::string inQuotes(std::string_view word);
 
-/// Reads a time such as 2s, 500ms, 1.5s, 1m, 2h or 2h10m; a bare number is seconds. At most a year. Throws
-/// UsageError.
+/// Reads a time such as 2s, 500ms, 1.5s, 1m, 2h or 2h10m; a bare number is seconds. Nothing for another text,
+/// and for more than a year.
+std::optional<std::chrono::nanoseconds> readTime(std::string_view text);
+
+/// The same for a text that must be one; throws UsageError.
 std::chrono::nanoseconds parseTime(std::string_view text);
 
 /// Reads a decimal or 0x hexadecimal number that fits Integer. `what` names it in the UsageError for all

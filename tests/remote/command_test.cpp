@@ -8,9 +8,11 @@
 #include <tuple>
 
 #include "messages/kvd_messages.h"
+#include "platform/base/failure.h"
 #include "remote/arguments.h"
 #include "remote/buttons.h"
 #include "remote/deliver.h"
+#include "remote/session.h"
 #include "tests/remote/fake_mach.h"
 
 namespace {
@@ -67,10 +69,21 @@ TEST(Command, ReadsTimes) {
   }
 }
 
+TEST(Command, TellsHowLongAButtonCanBeHeld) {
+  for (const std::string time : {"0", "601s", "2h10m", "9999h", "nan", "1e2s", "2d"}) {
+    try {
+      parse("play --hold=" + time);
+      ADD_FAILURE() << time;
+    } catch (const remote::UsageError& error) {
+      EXPECT_EQ(error.what(), "a button can be held for 1ms to 10m (500ms, 1.5s, 1m30s), not '" + time + "'");
+    }
+  }
+}
+
 TEST(Command, RefusesBadLines) {
   std::istringstream lines(
-      ";play menu;play --press --release;play --loud;unplay;play --hold;play --hold 0;play --hold 601s;"
-      "play --hold=nan;play --hold 1e2s;lock maybe;quit now;list --press;--raw 1 2;--raw 0x10000 2 1;"
+      ";play menu;play --press --release;play --loud;unplay;play --hold;play --user;"
+      "lock maybe;quit now;list --press;--raw 1 2;--raw 0x10000 2 1;"
       "--raw 1 -1 1;--raw 1 2 2147483648;--raw 1 2 --3;--raw 1 2 1x;--raw 1 2 99999999999999999999");
   for (std::string line; std::getline(lines, line, ';');) {
     EXPECT_THROW(parse(line), remote::UsageError) << line;
@@ -81,8 +94,18 @@ TEST(Buttons, SuggestNearestNames) {
   const std::pair<const char*, Names> cases[] = {{"plya", {"play"}},
                                                  {"vol", {"volume-up", "volume-down"}},
                                                  {"scan-nxt-track", {"scan-next-track"}},
-                                                 {"xyzzy", {}}};
+                                                 {"eject", {}},
+                                                 {"record", {}}};
   for (const auto& [name, nearest] : cases) EXPECT_EQ(remote::nearestButtonNames(name), nearest) << name;
+}
+
+TEST(Command, GoesToTheSessionThatIsNamed) {
+  setenv("XDG_RUNTIME_DIR", "/own", 1);
+  remote::chooseSession(parse("play").user);
+  EXPECT_STREQ(getenv("XDG_RUNTIME_DIR"), "/own");
+  remote::chooseSession(parse("play --user root").user);
+  EXPECT_STREQ(getenv("XDG_RUNTIME_DIR"), "/run/user/0");
+  EXPECT_THROW(remote::chooseSession("no such user"), remote::UsageError);
 }
 
 TEST(Buttons, OnlyHeldOnesReleaseOnATap) {
@@ -96,11 +119,12 @@ TEST(Buttons, OnlyHeldOnesReleaseOnATap) {
 
 TEST(Delivery, TellsWhyNothingWasSent) {
   const std::tuple<kern_return_t, mach_msg_return_t, int, const char*> cases[] = {
-      {BOOTSTRAP_UNKNOWN_SERVICE, 0, 1, "kvremote: nobody is listening on com.tarn.kvd\n"},
-      {0, MACH_SEND_INVALID_DEST, 1, "kvremote: nobody is listening on com.tarn.kvd\n"},
+      {BOOTSTRAP_UNKNOWN_SERVICE, 0, 1, "kvremote: nobody is there\n"},
+      {0, MACH_SEND_INVALID_DEST, 1, "kvremote: com.tarn.kvd has ended meanwhile\n"},
       {0, MACH_SEND_TIMED_OUT, 3, "kvremote: the queue of com.tarn.kvd stayed full for 5 seconds\n"},
       {KERN_FAILURE, 0, 1, "kvremote: cannot send to com.tarn.kvd (error 0x5)\n"},
   };
+  base::noteFailure("nobody is there");
   for (const auto& [lookUp, send, status, line] : cases) {
     gLookUpResult = lookUp;
     gSendResult = [result = send] { return result; };

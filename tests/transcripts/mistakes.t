@@ -18,9 +18,9 @@ open lyrabox
 front spindle
   error: Spindle does not run
 wait soon
-  error: not a time: 'soon' (2s, 500ms, 1.5s, 2h10m)
+  error: not a time: 'soon' (2s, 500ms, 1.5s, 2h10m; at most a year)
 wait 400d
-  error: not a time: '400d' (2s, 500ms, 1.5s, 2h10m)
+  error: not a time: '400d' (2s, 500ms, 1.5s, 2h10m; at most a year)
 volume 101
   error: an output volume is 0 to 100, not 101
 tell lyrabox to fly
