@@ -1,10 +1,12 @@
 #include <unistd.h>
 
 #include <cstdio>
+#include <exception>
 #include <iostream>
 #include <optional>
 #include <string_view>
 
+#include "platform/base/failure.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/live.h"
 #include "platform/stage/transcript.h"
@@ -30,7 +32,7 @@ int playAtTerminal() {
   const std::optional<int> shown = terminal::play();
   const int status = shown ? *shown : stage::playConsole(std::cout);
   if (status != 0) {
-    std::fputs("kvd-stage: kvd could not start; does another one run?\n", stderr);
+    std::fprintf(stderr, "kvd-stage: %s\n", base::lastFailure().c_str());
   } else if (shown) {
     std::puts("kvd has ended.");
   }
@@ -55,5 +57,10 @@ int main(int argc, char** argv) {
   }
   stage::setUpDesktop();
   const bool atTerminal = isatty(STDIN_FILENO) != 0 && isatty(STDOUT_FILENO) != 0;
-  return atTerminal ? playAtTerminal() : stage::playTranscript(STDIN_FILENO, std::cout);
+  try {
+    return atTerminal ? playAtTerminal() : stage::playTranscript(STDIN_FILENO, std::cout);
+  } catch (const std::exception& error) {
+    std::fprintf(stderr, "kvd-stage: %s\n", error.what());
+    return 1;
+  }
 }

@@ -6,11 +6,15 @@
 #include "platform/stage/transcript.h"
 
 #include <stdlib.h>
+#include <unistd.h>
 
 #include <algorithm>
+#include <cerrno>
+#include <cstring>
 #include <filesystem>
 #include <optional>
 #include <ostream>
+#include <stdexcept>
 #include <string>
 #include <utility>
 
@@ -35,7 +39,8 @@ Nanoseconds sCommandStart = 0;
 /// A command that was read but needs the daemon, which does not run yet.
 std::optional<std::string> sPending;
 bool sDaemonStarted = false;
-bool sCommandFailed = false;
+/// The daemon could not start, or a command was unknown or wrong.
+bool sFailed = false;
 bool sInputEnded = false;
 bool sServing = false;
 
@@ -63,7 +68,7 @@ void moveTime(std::optional<Nanoseconds> deadline) {
 
 void perform(const std::string& line) {
   sCommandStart = now();
-  if (!performCommand(line)) sCommandFailed = true;
+  if (!performCommand(line)) sFailed = true;
 }
 
 /// Reads the next command and performs it, or keeps it pending where the daemon must run first. False at the
@@ -111,12 +116,17 @@ void wait(std::optional<Nanoseconds> deadline) {
   }
 }
 
-/// A directory of its own for the service socket, so that rehearsals do not meet; empty when the service
-/// manager passed a socket.
+/// A directory of its own for the service socket, so that rehearsals meet neither each other nor a kvd at
+/// work; empty when the service manager passed a socket.
 std::string makePrivateDirectory() {
-  if (getenv("LISTEN_FDS") != nullptr) return {};
-  std::string path = std::filesystem::temp_directory_path() / "kvd-stage-XXXXXX";
-  if (mkdtemp(path.data()) == nullptr) return {};
+  const char* const passedTo = getenv("LISTEN_PID");
+  if (passedTo != nullptr && passedTo == std::to_string(getpid())) return {};
+  const char* const given = getenv("TMPDIR");
+  std::string path = std::string(given != nullptr && *given != '\0' ? given : "/tmp") + "/kvd-stage-XXXXXX";
+  if (mkdtemp(path.data()) == nullptr) {
+    throw std::runtime_error("cannot make the directory " + path + ": " + std::strerror(errno) +
+                             "; set TMPDIR to one that takes it");
+  }
   setenv("XDG_RUNTIME_DIR", path.c_str(), 1);
   return path;
 }
@@ -125,7 +135,7 @@ void playWithDaemon() {
   sDaemonStarted = true;
   const std::string directory = makePrivateDirectory();
   sCommandStart = now();
-  runDaemon();
+  if (runDaemon() != 0) sFailed = true;
   sServing = false;
   std::error_code ignored;
   if (!directory.empty()) std::filesystem::remove_all(directory, ignored);
@@ -148,7 +158,7 @@ int playTranscript(int input, std::ostream& output) {
   if (sPending) playWithDaemon();
   writeLines();
   setJournalListener(nullptr);
-  return sCommandFailed ? 1 : 0;
+  return sFailed ? 1 : 0;
 }
 
 void serve() {

@@ -24,7 +24,7 @@ TEST(Start, FailsBeforeAnythingIsAnnounced) {
   EXPECT_EQ(
       transcriptOf("break window-server\ntap play\nwait 1h\n"),
       "break window-server\ntap play\n  finds no window server\n  exit status 1\n  nobody is listening\n"
-      "wait 1h\n  left alive: nothing\n");
+      "wait 1h\n  left alive: nothing\nstatus 1\n");
 }
 
 TEST(Run, TakesThePortOffTheLoopDuringADispatchOnly) {

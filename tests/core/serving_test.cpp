@@ -156,6 +156,11 @@ TEST_F(Serving, EndsInOrderOnSIGTERM) {
   EXPECT_FALSE(std::filesystem::exists(getenv("XDG_RUNTIME_DIR"))) << "its private directory is gone";
 }
 
+TEST_F(Serving, GoesNowhereWithoutADirectoryOfItsOwn) {
+  start("quit\n", [] { setenv("TMPDIR", "/nonexistent", 1); });
+  EXPECT_EQ(finish(), "quit\nstatus 256");
+}
+
 TEST_F(Serving, TakesWhatWasQueuedBeforeItStarted) {
   std::string directory = std::filesystem::temp_directory_path() / "kvd-test-XXXXXX";
   ASSERT_NE(mkdtemp(directory.data()), nullptr);
