@@ -304,7 +304,7 @@ tap play
   asks whether VistremePlayerX runs: yes
   script to VistremePlayerX: get playing of front document = false
   asks whether VistremePlayer runs: yes
-  script to VistremePlayer: get get playing of front movie = false
+  script to VistremePlayer: get playing of front movie = false
   asks whether Slidewell runs: yes
   script to Slidewell: get playing = false
   asks whether Lyrabox runs: yes

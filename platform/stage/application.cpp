@@ -41,7 +41,11 @@ void Application::activate() {
 }
 
 void Application::deliver(bool waitsForReply) {
-  if (waitsForReply && hangsUntil > now()) pass(hangsUntil - now());
+  if (waitsForReply && hangsUntil > now()) {
+    desktop().waitedFor = this;
+    pass(hangsUntil - now());
+    desktop().waitedFor = nullptr;
+  }
   if (manner == Manner::Refuses) throw tarnscript::Refusal{name + " refuses"};
   advance();
 }

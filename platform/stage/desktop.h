@@ -41,6 +41,8 @@ struct Desktop {
   /// In the order they were started.
   std::vector<Process> running;
   std::optional<Process> front;
+  /// The one whose answer a script, and with it everybody, waits for just now.
+  const Application* waitedFor = nullptr;
   /// Changes whenever `running` does.
   std::uint32_t applicationListSeed = 1;
 

@@ -38,6 +38,8 @@ std::string shortened(std::string_view source) {
       body.remove_prefix(std::min<std::size_t>(body.size(), 1));
     }
   }
+  // A doubled word means no more, and looks like a mistake.
+  if (body.starts_with("get get ")) body.remove_prefix(4);
   std::string text = "script" + addressee + ": ";
   const std::size_t longest = text.size() + kLongestBody;
   for (const char c : body) {

@@ -159,6 +159,9 @@ void paintHint(const Box& box, const State& state, const Desktop& desktop) {
   std::wstring hint = widen(state.lessons.hint(desktop));
   if (state.showsHelp) {
     hint = L"Any other key leaves this page.";
+  } else if (desktop.waitedFor != nullptr) {
+    hint =
+        L"kvd waits for " + widen(desktop.waitedFor->name) + L" to answer. Keys wait with it; Ctrl-C quits.";
   } else if (state.held != nullptr) {
     hint = L"You hold " + std::wstring(state.held->what) + L". Press " + std::wstring(state.held->label) +
            L" again to let it go.";
