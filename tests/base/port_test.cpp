@@ -8,6 +8,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <csignal>
 #include <cstring>
 #include <fstream>
 #include <string>
@@ -171,9 +172,10 @@ TEST_F(Ports, RootReachesEverybody) {
     return setuid(kNobody) == 0 && checkIn(port) == KERN_SUCCESS && write(ends[1], "x", 1) == 1 &&
            Receiver(port).take(1).delivered == 1;
   });
+  close(ends[1]);
   char byte = 0;
   ASSERT_EQ(read(ends[0], &byte, 1), 1);
-  EXPECT_TRUE(sendOne());
+  if (!sendOne()) kill(user, SIGKILL);
   EXPECT_TRUE(succeeded(user));
 }
 
