@@ -24,7 +24,7 @@ namespace {
 
 constexpr char kService[] = "com.tarn.test";
 constexpr std::size_t kLargest = 48;
-constexpr uid_t kNobody = 65534;
+constexpr uid_t kStranger = 54321;
 constexpr gid_t kSame = static_cast<gid_t>(-1);
 
 kern_return_t checkIn(mach_port_t& port, const char* service = kService) {
@@ -158,18 +158,18 @@ TEST_F(Ports, ForeignShapesAreDroppedOrLeftToTheDecoder) {
   std::filesystem::permissions(directory.path, std::filesystem::perms::all);
   std::filesystem::permissions(path, std::filesystem::perms::all);
   const pid_t stranger =
-      inChild([&] { return setuid(kNobody) == 0 && write(raw.get(), bytes.data(), 24) == 24; });
+      inChild([&] { return setuid(kStranger) == 0 && write(raw.get(), bytes.data(), 24) == 24; });
   EXPECT_EQ(receiver.take(9).dropped, 5u);
   EXPECT_TRUE(succeeded(stranger));
 }
 
 TEST_F(Ports, RootReachesEverybody) {
   if (geteuid() != 0) GTEST_SKIP() << "it takes root";
-  ASSERT_EQ(chown(directory.path.c_str(), kNobody, kSame), 0);
+  ASSERT_EQ(chown(directory.path.c_str(), kStranger, kSame), 0);
   int ends[2];
   ASSERT_EQ(pipe(ends), 0);
   const pid_t user = inChild([&] {
-    return setuid(kNobody) == 0 && checkIn(port) == KERN_SUCCESS && write(ends[1], "x", 1) == 1 &&
+    return setuid(kStranger) == 0 && checkIn(port) == KERN_SUCCESS && write(ends[1], "x", 1) == 1 &&
            Receiver(port).take(1).delivered == 1;
   });
   close(ends[1]);
@@ -262,9 +262,9 @@ TEST_F(Ports, NeitherSideTrustsWhatOthersMayHaveMade) {
       {0755, us, us, true, true},
       {0720, us, us, false, false},
       {0702, us, us, false, false},
-      {0700, us, kNobody, true, false},
-      {0700, kNobody, us, false, false},
-      {0700, kNobody, kNobody, false, true},  // Only root sees these.
+      {0700, us, kStranger, true, false},
+      {0700, kStranger, us, false, false},
+      {0700, kStranger, kStranger, false, true},  // Only root sees these.
   };
   const base::FileDescriptor bound(boundSocket());
   for (const auto& [mode, directoryOwner, socketOwner, receives, sends] : cases) {
