@@ -1,7 +1,8 @@
 // latency_sender NAME: sends one press of Play/Pause for each line of its standard input, and writes the time
 // at which it set out, in nanoseconds on CLOCK_MONOTONIC. The line tells how: "call" calls the player NAME
-// over a connection to the session bus that is open, "button" sends to kvd's port, which is open too, and any
-// other line is a program and its arguments, separated by tabs, which is started and waited for.
+// over a connection to the session bus that is open, "button" sends to kvd's port, which is open too, "random
+// COUNT SEED" sends so many buttons there, and any other line is a program and its arguments, separated by
+// tabs, which is started and waited for.
 #include <spawn.h>
 #include <sys/wait.h>
 #include <systemd/sd-bus.h>
@@ -12,12 +13,14 @@
 #include <cstdio>
 #include <ctime>
 #include <iostream>
+#include <random>
 #include <sstream>
 #include <string>
 #include <vector>
 
 #include "messages/kvd_messages.h"
 #include "platform/mach.h"
+#include "remote/buttons.h"
 #include "remote/kvd_client.h"
 
 namespace {
@@ -36,6 +39,20 @@ bool press(mach_port_t port) {
   constexpr std::uint16_t kConsumerPage = 0x0C;
   constexpr std::uint16_t kPlayPause = 0xCD;
   return kvd_handlehidevent(port, kConsumerPage, kPlayPause, 0, 1) == MACH_MSG_SUCCESS;
+}
+
+bool pressAtRandom(mach_port_t port, const std::string& line) {
+  int count = 0;
+  unsigned seed = 0;
+  std::sscanf(line.c_str(), "random %d %u", &count, &seed);
+  std::mt19937 random(seed);
+  const auto buttons = remote::buttons();
+  for (int i = 0; i < count; ++i) {
+    const remote::Button& button = buttons[random() % buttons.size()];
+    const auto value = static_cast<std::int32_t>(random() % 3) - 1;
+    if (kvd_handlehidevent(port, button.usagePage, button.usage, 0, value) != MACH_MSG_SUCCESS) return false;
+  }
+  return true;
 }
 
 bool run(const std::string& line) {
@@ -74,7 +91,10 @@ int main(int argc, char** argv) {
   for (std::string line; std::getline(std::cin, line);) {
     timespec start = {};
     clock_gettime(CLOCK_MONOTONIC, &start);
-    const bool sent = line == "call" ? call(bus, player.c_str()) : line == "button" ? press(port) : run(line);
+    const bool sent = line == "call"                ? call(bus, player.c_str())
+                      : line == "button"            ? press(port)
+                      : line.starts_with("random ") ? pressAtRandom(port, line)
+                                                    : run(line);
     if (!sent) {
       std::fprintf(stderr, "latency_sender: could not send by %s\n", line.c_str());
       return 1;
