@@ -1,8 +1,8 @@
 // The connection to the X server: made, lost and made again, and never waited for longer than a question may
 // take.
 //
-// It is on the run loop, for the sake of the server, which keeps what nobody reads. What has changed is told by
-// events; they are few, as only the root window's properties are watched.
+// It is on the run loop, for the sake of the server, which keeps what nobody reads. What has changed is told
+// by events; they are few, as only the root window's properties are watched.
 #pragma once
 
 #include <xcb/xcb.h>
