@@ -4,7 +4,6 @@
 
 #include <set>
 
-#include "adapters/lyrabox.h"
 #include "registry/registry.h"
 #include "remote/buttons.h"
 #include "routing/dispatcher.h"
@@ -150,31 +149,6 @@ TEST(Dispatcher, FollowsTheApplicationListAndKeepsTheTargetOfARepeat) {
       "asks who is in front: Lyrabox\n--\n"
       "finds Lyrabox running\nfinds Spindle running\n"
       "script to Lyrabox: stop\nkept");
-}
-
-TEST(Lyrabox, OffersCommandsAndQueriesToOthers) {
-  EXPECT_EQ(inChild([] {
-              set("open lyrabox; tell lyrabox to play");
-              const auto state = [] {
-                return codeText(LyraboxPlayerState()) + (LyraboxIsPlaying() ? " plays; " : " silent; ");
-              };
-              std::string states = state();
-              LyraboxCommand_Pause();
-              states += state();
-              set("close lyrabox");
-              states += state();
-              sent();
-              set("open lyrabox");
-              journal();
-              LyraboxCommand_VolumeUp();
-              LyraboxCommand_VolumeDown();
-              return states + journal();
-            }),
-            "kPSP plays; kPSU silent; .... silent; "
-            "script to Lyrabox: set sound volume to sound volume + 2\n"
-            "Lyrabox: volume 60 → 62\n"
-            "script to Lyrabox: set sound volume to sound volume - 2\n"
-            "Lyrabox: volume 62 → 60\n");
 }
 
 }  // namespace

@@ -2,8 +2,6 @@
 
 #include <fcntl.h>
 #include <gtest/gtest.h>
-#include <sys/socket.h>
-#include <sys/un.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -159,33 +157,6 @@ TEST_F(Serving, EndsInOrderOnSIGTERM) {
 TEST_F(Serving, GoesNowhereWithoutADirectoryOfItsOwn) {
   start("quit\n", [] { setenv("TMPDIR", "/nonexistent", 1); });
   EXPECT_EQ(finish(), "quit\nstatus 256");
-}
-
-TEST_F(Serving, TakesWhatWasQueuedBeforeItStarted) {
-  std::string directory = std::filesystem::temp_directory_path() / "kvd-test-XXXXXX";
-  ASSERT_NE(mkdtemp(directory.data()), nullptr);
-  setenv("XDG_RUNTIME_DIR", directory.c_str(), 1);
-  sockaddr_un address{AF_UNIX, {}};
-  const std::string path = directory + "/" + kKVDServiceName;
-  path.copy(address.sun_path, sizeof address.sun_path - 1);
-  const int passed = socket(AF_UNIX, SOCK_DGRAM, 0);
-  ASSERT_EQ(bind(passed, reinterpret_cast<const sockaddr*>(&address), sizeof address), 0);
-  lookUp();
-  sendButton(Key::Play);
-
-  constexpr int kFirstPassed = 3;
-  start("open lyrabox\nfront lyrabox\n", [&] {
-    dup2(passed, kFirstPassed);
-    setenv("LISTEN_PID", std::to_string(getpid()).c_str(), 1);
-    setenv("LISTEN_FDS", "1", 1);
-    setenv("LISTEN_FDNAMES", kKVDServiceName, 1);
-  });
-  ASSERT_EQ(kvd_terminate(port_), MACH_MSG_SUCCESS);
-  const std::string transcript = finish();
-  EXPECT_NE(transcript.find("playpause\n  Lyrabox: plays"), std::string::npos) << transcript;
-  EXPECT_TRUE(std::filesystem::exists(path)) << "the service manager's socket stays";
-  close(passed);
-  std::filesystem::remove_all(directory);
 }
 
 }  // namespace

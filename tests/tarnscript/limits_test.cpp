@@ -66,22 +66,6 @@ TEST(Limits, ListsAndTexts) {
   EXPECT_EQ(runScript(wrap + " + 1 times\nset x to {x}\nend"), "error 3: lists are nested too deeply");
 }
 
-TEST(Limits, LongestListFitsItsLoop) {
-  FakeWorld world;
-  auto& albums = world.player.contents[{words::kApp, words::kAlbum}];
-  for (std::uint64_t id = albums.size() + 1; id <= kMaxListLength; ++id) {
-    albums.push_back(id);
-    world.player.state[{words::kAlbum, id, code("ID  ")}] = static_cast<std::int64_t>(id + 10);
-  }
-  const std::string source =
-      "tell application \"com.tarn.Player\"\nset theAlbums to the id of every album\n"
-      "repeat with i from 1 to count theAlbums\nif item i of theAlbums is id of current album then\n"
-      "set n to i\nend if\nend repeat\nn\nend tell";
-  EXPECT_EQ(runScript(world, source), "3");
-  albums.push_back(1);
-  EXPECT_EQ(runScript(world, source), "error 2: a list is too long");
-}
-
 TEST(Limits, BrokenTextsAreAnswered) {
   const std::string whole =
       "tell application id\"com.tarn.Player\"\nset theAlbums to the id of every album\nset n to -1\n"

@@ -92,17 +92,4 @@ TEST_F(Controls, TheCommandLineTakesEveryCharacterAsText) {
   EXPECT_EQ(commands(), L"volume 7; ");
 }
 
-TEST_F(Controls, HelpTakesOneKeyToLeaveAndPagesToRead) {
-  state_.page = 5;
-  type(L"?");
-  press(Special::PageDown);
-  EXPECT_TRUE(state_.showsHelp);
-  EXPECT_EQ(state_.scrolled, 5);
-  type(L" ");
-  EXPECT_FALSE(state_.showsHelp);
-  EXPECT_EQ(commands(), L"");
-  type(L"?q");
-  EXPECT_EQ(commands(), L"quit; ");
-}
-
 }  // namespace
