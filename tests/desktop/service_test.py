@@ -18,7 +18,8 @@ GROUPS = "/sys/fs/cgroup"
 # The bus as desktops run it: the service manager joins it, and starts programs for those that ask.
 UNITS = {"dbus.socket": "[Socket]\nListenStream=%t/bus\n",
          "dbus.service": "[Service]\nExecStart=dbus-daemon --session --address=systemd: --nofork --nopidfile\n"}
-JUKEBOX = "[Desktop Entry]\nType=Application\nName=Jukebox\nExec=sleep 1000\nX-Kvd-Application=com.tarn.Lyrabox\n"
+JUKEBOX = ("[Desktop Entry]\nType=Application\nName=Jukebox\nExec=sh -c 'echo \"$0\" >words; exec sleep 1000' ${HOME}100%% %U\n"
+           "X-Kvd-Application=com.tarn.Lyrabox\n")
 
 
 class Failed(Exception):
@@ -152,6 +153,8 @@ def play(session):
     print("a player that it starts is not its child, is started once, and outlives it")
     session.run("kvremote", "play")
     wait(session.jukeboxes, "a music player was started")
+    words = os.path.join(session.home, "words")
+    wait(lambda: os.path.exists(words) and read(words) == "${HOME}100%\n", "its words are as its entry has them")
     session.run("kvremote", "play")
     session.run("kvremote", "volume-down")
     wait(lambda: session.volume() == "90%", "the second press is over")
