@@ -38,3 +38,14 @@ newcomer: obeys=GetAll
 tap play
   newcomer: Play
 wait 1s
+quit newcomer
+# One that takes its time to say what it does is taken to do what it did last, and told without waiting.
+player audacious silent
+tell Lyrabox to get player state
+  = 'kPSU'
+audacious: holds=Get
+tap play
+  audacious: Play
+audacious: answers
+tell Lyrabox to get player state
+  = 'kPSP'
