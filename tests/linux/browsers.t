@@ -20,13 +20,13 @@ tap play
   strawberry: PlayPause
 # The extension that speaks for it is heard where it does not speak for itself; its window is the browser's.
 firefox: playing
-player extension as=plasma-browser-integration DesktopEntry=firefox-esr title=Film
+player extension as=plasma-browser-integration DesktopEntry=firefox-esr title=Film playing
 tap play
   strawberry: Pause
   firefox: Pause
 firefox: drops=org.mpris.MediaPlayer2.firefox.instance_1_6
 tap play
-  extension: Play
+  extension: Pause
 quit extension
 firefox: owns=org.mpris.MediaPlayer2.firefox.instance_1_6 playing
 # None is started to play films, and one whose entry says so is none.
