@@ -115,7 +115,7 @@ bool say(Program& program, const std::string& words) {
   return !hear(program).empty() && written;
 }
 
-Program& find(const std::string& name) {
+Program& find(std::string_view name) {
   const auto found = std::ranges::find(sPrograms, name, &Program::name);
   if (found == sPrograms.end()) throw remote::UsageError("no program is called " + remote::inQuotes(name));
   return *found;
@@ -200,7 +200,7 @@ void startProgram(const std::string& name, const std::string& executable, std::v
   child.uniqueName = hear(child).substr(std::string_view("ready ").size());
 }
 
-const Program& program(const std::string& name) { return find(name); }
+const Program& program(std::string_view name) { return find(name); }
 
 void tellProgram(const std::string& name, const std::string& words) { say(find(name), words); }
 

@@ -6,6 +6,7 @@
 
 #include <cstdio>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace fake {
@@ -33,7 +34,7 @@ struct Program {
 
 /// Starts a program with this executable name, later than those before it by the kernel's clock.
 void startProgram(const std::string& name, const std::string& executable, std::vector<std::string> words);
-const Program& program(const std::string& name);
+const Program& program(std::string_view name);
 void tellProgram(const std::string& name, const std::string& words);
 /// Its windows go too.
 void endProgram(const std::string& name);
