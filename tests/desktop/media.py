@@ -62,6 +62,7 @@ def music():
     os.mkdir("music")
     for number in COLOURS:
         ffmpeg(*sound(300, 220 * number), "-metadata", f"title=Track {number}", f"music/{number}.ogg")
+    write("music/all.m3u", "".join(f"{number}.ogg\n" for number in COLOURS))
 
 
 def film():

@@ -1,10 +1,9 @@
 """The programs that play roles, each with something to play, and what they tell of themselves."""
-import glob
 import json
 import socket
 import time
 
-from desktop import Failed, wait
+from desktop import Failed, lasts, wait
 
 
 class Program:
@@ -86,9 +85,12 @@ class Player(Program):
 
 class Strawberry(Player):
     def __init__(self, desktop):
-        tracks = sorted(glob.glob(f"{desktop.media}/music/*"))
-        super().__init__(desktop, "strawberry", "strawberry", "strawberry", *tracks)
-        self.become(CanGoNext=True, settled=True)
+        super().__init__(desktop, "strawberry", "strawberry", "strawberry")
+        # Version 1.2 takes no files when it is started. What it is told to open it plays.
+        self.ask("call", "OpenUri", "s", f"file://{desktop.media}/music/all.m3u")
+        self.become(CanGoNext=True, under_way=True)
+        self.ask("call", "Stop")
+        self.become(PlaybackStatus="Stopped", settled=True)
 
 
 class Mpv(Player):
@@ -116,7 +118,14 @@ class Celluloid(Player):
         super().__init__(desktop, name.lower(), name + ".instance-1", "celluloid")
         # Given the film when it is started, it sometimes leaves it paused.
         self.ask("call", "OpenUri", "s", f"file://{desktop.media}/film.mkv")
-        self.become(PlaybackStatus="Playing", under_way=True)
+        self.become(PlaybackStatus="Playing", under_way=True, prompt=True)
+
+    def prompt(self):
+        """Whether it answers at once for a while. Its first drawing holds it up for longer than kvd waits."""
+        def at_once():
+            began = time.monotonic()
+            return self.position() and time.monotonic() - began < 0.3
+        return lasts(at_once, 2)
 
 
 class Vlc(Player):
