@@ -85,6 +85,9 @@ class Player(Program):
 
 class Strawberry(Player):
     def __init__(self, desktop):
+        # Left to buffer after a seek, version 1.2 sometimes stands still and says that it plays.
+        desktop.write(".config/strawberry/strawberry.conf",
+                      "[Backend]\nbufferlowwatermark=0\nbufferhighwatermark=0.01\n")
         super().__init__(desktop, "strawberry", "strawberry", "strawberry")
         # Version 1.2 takes no files when it is started. What it is told to open it plays.
         self.ask("call", "OpenUri", "s", f"file://{desktop.media}/music/all.m3u")
