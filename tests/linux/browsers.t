@@ -25,8 +25,11 @@ tap play
   strawberry: Pause
   firefox: Pause
 firefox: drops=org.mpris.MediaPlayer2.firefox.instance_1_6
+extension: paused
+strawberry: playing
 tap play
-  extension: Pause
+  strawberry: Pause
+  extension: Play
 quit extension
 firefox: owns=org.mpris.MediaPlayer2.firefox.instance_1_6 playing
 # None is started to play films, and one whose entry says so is none.

@@ -46,6 +46,10 @@ tell Lyrabox to get player state
 audacious: holds=Get
 tap play
   audacious: Play
+audacious: answers paused holds=Play
+wait 2s
+tell Lyrabox to play
+  audacious: Play
 audacious: answers
 tell Lyrabox to get player state
   = 'kPSP'

@@ -61,7 +61,12 @@ tell Lyrabox to play
   fails
 tell Lyrabox to get player state
   = 'kPSU'
-strawberry: dies=PlayPause
+strawberry: playing refuses=Pause
+tell Lyrabox to pause
+  strawberry: Pause
+tell Lyrabox to get player state
+  = 'kPSP'
+strawberry: paused dies=PlayPause
 tell Lyrabox to play
   strawberry: PlayPause
   strawberry: gone
