@@ -192,7 +192,7 @@ bool hasMedia(Player& player) {
     return state.told != PlaybackStatus::Stopped &&
            (!state.title.empty() || !state.url.empty() || state.length.has_value());
   } catch (const tarnscript::Refusal&) {
-    return false;
+    return player.lastKnown != PlaybackStatus::Stopped;
   }
 }
 

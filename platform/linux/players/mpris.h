@@ -44,7 +44,7 @@ PlaybackStatus statusOf(Player& player);
 /// As it answers now, whatever its signals told, or as last known where it does not answer in time.
 PlaybackStatus statusToldBy(Player& player);
 
-/// Whether it plays or has paused something; false where it does not answer.
+/// Whether it plays or has paused something; where it does not answer, whether it did when last known.
 bool hasMedia(Player& player);
 
 /// Of org.mpris.MediaPlayer2; nothing where the player does not tell.

@@ -59,7 +59,8 @@ Instance instanceOf(Casting casting) {
 
 void addPlayers(std::vector<Instance>& found) {
   for (Player& player : players::list()) {
-    const Program* const known = programByBusName(player.name);
+    const Program* known = programByBusName(player.name);
+    if (known == nullptr) known = programByEntry(player.desktopEntry);
     player.quirks = known != nullptr ? known->quirks : players::Quirks{players::kUnknown};
     Casting casting = castPlayer(player.desktopEntry, player.name);
     if (casting.role == Role::None) continue;
