@@ -1,10 +1,15 @@
+# No browser is started to play films.
+entry org.gnome.Epiphany DBusActivatable=true
+program web owns=org.gnome.Epiphany
+start
+tell VistremePlayerX to launch
+
 # A browser is a player while a page has something to play.
 entry firefox-esr Categories=Network;WebBrowser;
 player strawberry
 player firefox as=firefox.instance_1_6 DesktopEntry=firefox-esr stopped
 window Page of firefox class=firefox-esr
 front Page
-start
 tap play
   strawberry: PlayPause
 firefox: title=Film playing
@@ -32,11 +37,8 @@ tap play
   extension: Play
 quit extension
 firefox: owns=org.mpris.MediaPlayer2.firefox.instance_1_6 playing
-# None is started to play films, and one whose entry says so is none.
-entry org.gnome.Epiphany DBusActivatable=true
-program web owns=org.gnome.Epiphany
+# One whose entry says so is none.
 quit firefox
-tell VistremePlayerX to launch
 entry chromium X-Kvd-Application=none
 player chromium as=chromium.instance4711 title=Film playing
 tap play
