@@ -50,6 +50,9 @@ void loseConnection() {
 
 /// False when nothing came before the deadline.
 bool waitFor(sd_bus* connection, const base::Deadline& deadline) {
+  // sd_bus_wait does not count what has been read already.
+  std::uint64_t queued = 0;
+  if (sd_bus_get_n_queued_read(connection, &queued) >= 0 && queued > 0) return true;
   const auto left = std::chrono::ceil<Limit>(deadline.left());
   return sd_bus_wait(connection, static_cast<std::uint64_t>(left.count())) > 0;
 }
