@@ -21,8 +21,13 @@ press forward
 release forward
   mpv: Pause
   mpv: Set Rate 1.5
-# A rate that somebody else left behind is none at which people watch.
+# A rate that somebody else left behind is none at which people watch, and neither is 0.
 mpv: Rate=4 playing
+press forward
+  mpv: Set Rate 2
+release forward
+  mpv: Set Rate 1
+mpv: Rate=0
 press forward
   mpv: Set Rate 2
 release forward

@@ -92,7 +92,9 @@ void readProperty(sd_bus_message* message, std::string_view key, std::string_vie
   if (key == mpris::kPlaybackStatus) {
     state.told = mpris::statusNamed(readText(message, type).value_or("")).value_or(PlaybackStatus::Stopped);
   } else if (key == "Rate") {
-    state.rate = held(readNumber(message, type), -kFastestRate, kFastestRate, 1);
+    // Nothing plays at rate 0, though some say so.
+    const double rate = held(readNumber(message, type), -kFastestRate, kFastestRate, 1);
+    state.rate = rate != 0 ? rate : 1;
   } else if (key == "MinimumRate") {
     state.minimumRate = held(readNumber(message, type), -kFastestRate, kFastestRate, 1);
   } else if (key == "MaximumRate") {
