@@ -72,6 +72,40 @@ tell Lyrabox to play
   strawberry: gone
   fails
 
+# One that quick seeks bring to a stand for good is paused while it is scanned, however long it takes to pause.
+player rhythmbox length=3m Position=1m playing says=Playing
+press forward
+  rhythmbox: Pause
+wait 0.75s
+  +0.25s  rhythmbox: SetPosition /track/1 62s
+  +0.5s  rhythmbox: SetPosition /track/1 64s
+  +0.75s  rhythmbox: SetPosition /track/1 66s
+rhythmbox: says=
+release forward
+  rhythmbox: PlayPause
+wait 1s
+# It plays on where the track ends under the scan; played by hand it is left alone, and stopped it stays so.
+rhythmbox: Position=2m55s
+press forward
+  rhythmbox: Pause
+wait 0.5s
+  +0.25s  rhythmbox: SetPosition /track/1 177s
+  +0.5s  rhythmbox: SetPosition /track/1 179s
+  +0.5s  rhythmbox: PlayPause
+press rewind
+  rhythmbox: Pause
+wait 0.25s
+  +0.25s  rhythmbox: SetPosition /track/1 177s
+rhythmbox: playing
+wait 0.75s
+  +0.25s  rhythmbox: SetPosition /track/1 175s
+release rewind
+press rewind
+  rhythmbox: Pause
+tap stop
+wait 0.5s
+quit rhythmbox
+
 # One that nobody knows, and that does not obey Play, gets PlayPause a second later, unless somebody else plays by then.
 entry newcomer Categories=AudioVideo;Audio;Player;
 player newcomer DesktopEntry=newcomer ignores=Play

@@ -1,82 +1,82 @@
 # A music player: play, pause, skip, and a scan while a button is held down.
-player strawberry length=3m
+player audacious length=3m
 start
 tap play
-  strawberry: PlayPause
+  audacious: Play
 tap play
-  strawberry: Pause
+  audacious: Pause
 tap next
-  strawberry: Next
+  audacious: Next
 # A track that has only begun is left for the one before, another begins anew.
 tap previous
-  strawberry: Previous
-strawberry: Position=20s
+  audacious: Previous
+audacious: Position=20s
 tap previous
-  strawberry: SetPosition /track/1 0s
+  audacious: SetPosition /track/1 0s
 # A scan goes at eight times the speed, four steps a second, for as long as the button is held.
-strawberry: playing Position=1m
+audacious: playing Position=1m
 wait 1s
 press forward
 wait 0.5s
-  +0.25s  strawberry: SetPosition /track/1 62s
-  +0.5s  strawberry: SetPosition /track/1 64s
+  +0.25s  audacious: SetPosition /track/1 62s
+  +0.5s  audacious: SetPosition /track/1 64s
 tell Lyrabox to get player state
   = 'kPSF'
 release forward
 wait 1s
 # Backward it ends where the track begins, forward a second before its end, though the button is still down.
-strawberry: Position=3s
+audacious: Position=3s
 press rewind
 wait 2s
-  +0.25s  strawberry: SetPosition /track/1 1s
-  +0.5s  strawberry: SetPosition /track/1 0s
+  +0.25s  audacious: SetPosition /track/1 1s
+  +0.5s  audacious: SetPosition /track/1 0s
 release rewind
-strawberry: Position=2m55s
+audacious: Position=2m55s
 press forward
 wait 2s
-  +0.25s  strawberry: SetPosition /track/1 177s
-  +0.5s  strawberry: SetPosition /track/1 179s
+  +0.25s  audacious: SetPosition /track/1 177s
+  +0.5s  audacious: SetPosition /track/1 179s
 release forward
 # Another track is scanned from where it stands.
 press rewind
-strawberry: track=/track/2 Position=10s
+audacious: track=/track/2 Position=10s
 wait 0.25s
-  +0.25s  strawberry: SetPosition /track/2 8s
+  +0.25s  audacious: SetPosition /track/2 8s
 release rewind
 # Somebody pauses by hand: that ends the scan, at the second look, as some players pause to seek.
 wait 1s
 press forward
 wait 0.25s
-  +0.25s  strawberry: SetPosition /track/2 10s
-strawberry: says=Paused
+  +0.25s  audacious: SetPosition /track/2 10s
+audacious: says=Paused
 wait 0.25s
-  +0.25s  strawberry: SetPosition /track/2 12s
-strawberry: says=
+  +0.25s  audacious: SetPosition /track/2 12s
+audacious: says=
 wait 0.25s
-  +0.25s  strawberry: SetPosition /track/2 14s
-strawberry: paused
+  +0.25s  audacious: SetPosition /track/2 14s
+audacious: paused
 wait 1s
-  +0.25s  strawberry: SetPosition /track/2 16s
+  +0.25s  audacious: SetPosition /track/2 16s
 release forward
 # What stands still is scanned silently, and stands still after it. Play in mid-scan stops it all.
 press rewind
 wait 0.25s
-  +0.25s  strawberry: SetPosition /track/2 14s
+  +0.25s  audacious: SetPosition /track/2 14s
 release rewind
 tell Lyrabox to get player state
   = 'kPSU'
-strawberry: playing
+audacious: playing
 wait 1s
 press rewind
 tap play
-  strawberry: Pause
+  audacious: Pause
 wait 1s
 # A player that cannot seek any more is not scanned any longer, and one that has gone is forgotten.
 press forward
-strawberry: refuses=SetPosition
+audacious: refuses=SetPosition
 wait 1s
-  +0.25s  strawberry: SetPosition /track/2 16s
+  +0.25s  audacious: SetPosition /track/2 16s
 release forward
 press forward
-quit strawberry
+quit audacious
 wait 1s

@@ -12,6 +12,10 @@ namespace {
 /// From here on a rate is a scan's, which somebody else may have begun, and not one at which people watch.
 constexpr double kSlowestScan = 2;
 
+void endOwnFastPlaying(Player& player) {
+  if (const auto rate = std::exchange(player.ownRate, std::nullopt)) setRate(player, *rate);
+}
+
 }  // namespace
 
 void start(Player& player) {
@@ -21,6 +25,7 @@ void start(Player& player) {
 }
 
 void standStill(Player& player) {
+  giveUpScan(player);
   pause(player);
   endFastPlaying(player);
 }
@@ -36,7 +41,7 @@ void playAtRate(Player& player, const PlayerState& state, double rate) {
   if (rate == 1 && (player.ownRate || scanRate(player))) return start(player);
   if (!takesRate(player, state, rate)) {
     if (rate == 1) return start(player);
-    endFastPlaying(player);
+    endOwnFastPlaying(player);
     return scan(player, rate);
   }
   endScan(player);
@@ -47,7 +52,7 @@ void playAtRate(Player& player, const PlayerState& state, double rate) {
 
 void endFastPlaying(Player& player) {
   endScan(player);
-  if (const auto rate = std::exchange(player.ownRate, std::nullopt)) setRate(player, *rate);
+  endOwnFastPlaying(player);
 }
 
 }  // namespace linux::players

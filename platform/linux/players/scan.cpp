@@ -30,6 +30,8 @@ struct Scan {
   /// else for one step may come from the seek.
   PlaybackStatus status;
   bool strayed;
+  /// It was paused for the scan, and has not been seen so yet; and it is to play when the scan ends.
+  bool awaitsPause, resumes;
   /// What is scanned, and where in it the scan stands. Players that seek to the nearest key frame or answer
   /// with an old position do not hold it up.
   std::string trackID;
@@ -53,13 +55,24 @@ void end(std::list<Scan>::iterator scan) {
   sScans.erase(scan);
 }
 
+void endAndResume(std::list<Scan>::iterator scan) {
+  Player* const player = scan->resumes ? findPlayer(scan->owner) : nullptr;
+  end(scan);
+  if (player != nullptr) play(*player);
+}
+
 /// One seek. False when the scan has come to an end.
 bool step(Scan& scan) {
   Player* const player = findPlayer(scan.owner);
   if (player == nullptr) return false;
   const PlayerState state = stateOf(*player);
-  const bool strayedBefore = std::exchange(scan.strayed, state.told != scan.status);
-  if (scan.strayed && strayedBefore) return false;
+  if (state.told == scan.status) scan.awaitsPause = false;
+  const bool strays = state.told != scan.status && !scan.awaitsPause;
+  const bool strayedBefore = std::exchange(scan.strayed, strays);
+  if (strays && strayedBefore) {
+    scan.resumes = false;
+    return false;
+  }
   if (state.trackID != scan.trackID || state.url != scan.url) {
     scan.trackID = state.trackID;
     scan.url = state.url;
@@ -86,7 +99,11 @@ void tick(HostTimerRef timer, void*) {
   } catch (const tarnscript::Refusal&) {
     // A player that does not answer or cannot seek is not scanned any longer.
   }
-  if (!goesOn) end(scan);
+  try {
+    if (!goesOn) endAndResume(scan);
+  } catch (const tarnscript::Refusal&) {
+    // Nobody waits to be told.
+  }
 }
 
 }  // namespace
@@ -99,19 +116,27 @@ void scan(Player& player, double rate) {
     present->rate = rate;
     return;
   }
-  const PlayerState state = stateOf(player);
+  PlayerState state = stateOf(player);
   if (!state.canSeek || state.status == PlaybackStatus::Stopped) {
     throw tarnscript::Refusal{"there is nothing to scan through"};
   }
   const HostTimerRef timer =
       HostCreateRepeatingTimer(HostAbsoluteTime() + kInterval, kInterval, tick, nullptr);
   if (!timer) throw tarnscript::Refusal{"there is no timer"};
-  sScans.push_back({player.callee.name, rate, state.status, false, state.trackID, state.url, state.position,
-                    base::Clock::now(), timer});
+  const bool rests = (player.quirks & kStallsOnSeeks) != 0 && state.status == PlaybackStatus::Playing;
+  if (rests) state.status = PlaybackStatus::Paused;
+  sScans.push_back({player.callee.name, rate, state.status, false, rests, rests, state.trackID, state.url,
+                    state.position, base::Clock::now(), timer});
   HostRunLoopAddTimer(HostRunLoopCurrent(), timer, HostRunLoopMode::Default);
+  if (rests) pause(player);
 }
 
 void endScan(Player& player) {
+  const auto present = scanOf(player);
+  if (present != sScans.end()) endAndResume(present);
+}
+
+void giveUpScan(const Player& player) {
   const auto present = scanOf(player);
   if (present != sScans.end()) end(present);
 }

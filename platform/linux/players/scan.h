@@ -16,6 +16,9 @@ void scan(Player& player, double rate);
 /// Ends it, where one goes on; what played plays on at its normal rate, what was paused stays so.
 void endScan(Player& player);
 
+/// Ends it without a word to the player, which may have been paused for it.
+void giveUpScan(const Player& player);
+
 /// The rate asked for; nothing while the player is not scanning.
 std::optional<double> scanRate(const Player& player);
 

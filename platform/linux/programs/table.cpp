@@ -21,6 +21,7 @@ using players::kIgnoresRaise;
 using players::kIgnoresRate;
 using players::kNeedsMedia;
 using players::kSpeaksForBrowser;
+using players::kStallsOnSeeks;
 
 namespace lyrabox = scripting::lyrabox;
 namespace movies = scripting::movies;
@@ -34,8 +35,8 @@ constexpr players::Quirks kBrowser = kNeedsMedia | kIgnoresRate;
 // One program a row, its actions one a line below it.
 // clang-format off
 constexpr Program kPrograms[] = {
-    {.role = Role::Jukebox, .name = "Strawberry", .entry = "org.strawberrymusicplayer.strawberry", .busName = "strawberry", .windowClass = "strawberry", .quirks = kIgnoresRate | kIgnoresPlay},
-    {.role = Role::Jukebox, .name = "Rhythmbox", .entry = "org.gnome.Rhythmbox3", .busName = "rhythmbox", .windowClass = "rhythmbox", .quirks = kIgnoresRate | kIgnoresPlay},
+    {.role = Role::Jukebox, .name = "Strawberry", .entry = "org.strawberrymusicplayer.strawberry", .busName = "strawberry", .windowClass = "strawberry", .quirks = kIgnoresRate | kIgnoresPlay | kStallsOnSeeks},
+    {.role = Role::Jukebox, .name = "Rhythmbox", .entry = "org.gnome.Rhythmbox3", .busName = "rhythmbox", .windowClass = "rhythmbox", .quirks = kIgnoresRate | kIgnoresPlay | kStallsOnSeeks},
     {.role = Role::Jukebox, .name = "Elisa", .entry = "org.kde.elisa", .busName = "elisa", .windowClass = "elisa", .quirks = kIgnoresRate},
     {.role = Role::Jukebox, .name = "Lollypop", .entry = "org.gnome.Lollypop", .busName = "Lollypop", .windowClass = "lollypop", .quirks = kIgnoresRate},
     {.role = Role::Jukebox, .name = "Amberol", .entry = "io.bassi.Amberol", .busName = "Amberol", .windowClass = "io.bassi.Amberol", .quirks = kIgnoresRate},
@@ -80,9 +81,9 @@ constexpr Program kPrograms[] = {
     {.role = Role::ClassicMovies, .name = "SMPlayer", .entry = "smplayer", .busName = "smplayer", .windowClass = "smplayer"},
 
     {.role = Role::ModernMovies, .name = "Celluloid", .entry = "io.github.celluloid_player.Celluloid", .busName = "io.github.celluloid_player.Celluloid", .windowClass = "celluloid", .channel = ChannelKind::Mpv, .executable = "celluloid"},
-    {.role = Role::ModernMovies, .name = "Totem", .entry = "org.gnome.Totem", .busName = "totem", .windowClass = "totem"},
+    {.role = Role::ModernMovies, .name = "Totem", .entry = "org.gnome.Totem", .busName = "totem", .windowClass = "totem", .quirks = kStallsOnSeeks},
     {.role = Role::ModernMovies, .name = "Haruna", .entry = "org.kde.haruna", .busName = "haruna", .windowClass = "haruna"},
-    {.role = Role::ModernMovies, .name = "Clapper", .entry = "com.github.rafostar.Clapper", .busName = "Clapper", .windowClass = "com.github.rafostar.Clapper"},
+    {.role = Role::ModernMovies, .name = "Clapper", .entry = "com.github.rafostar.Clapper", .busName = "Clapper", .windowClass = "com.github.rafostar.Clapper", .quirks = kStallsOnSeeks},
     {.role = Role::ModernMovies, .name = "Showtime", .entry = "org.gnome.Showtime", .busName = "Showtime", .windowClass = "org.gnome.Showtime"},
     {.role = Role::ModernMovies, .name = "Dragon Player", .entry = "org.kde.dragonplayer", .busName = "dragonplayer", .windowClass = "dragonplayer"},
     {.role = Role::ModernMovies, .name = "Parole", .entry = "org.xfce.Parole", .busName = "parole", .windowClass = "parole"},
@@ -134,7 +135,7 @@ constexpr Program kPrograms[] = {
          {words::kPreviousAlbum, Means::Mpris, "Previous"},
          {words::kSpace, Means::Mpris, "PlayPause"},
      }}},
-    {.role = Role::PhotoLibrary, .name = "Shotwell", .entry = "org.gnome.Shotwell", .windowClass = "shotwell", .show = ShowStyle::OwnWindow},
+    {.role = Role::PhotoLibrary, .name = "Shotwell", .entry = "org.gnome.Shotwell", .windowClass = "shotwell"},
     {.role = Role::PhotoLibrary, .name = "Loupe", .entry = "org.gnome.Loupe", .windowClass = "org.gnome.Loupe"},
 
     {.role = Role::ProfessionalPhotos, .name = "darktable", .entry = "org.darktable.darktable", .windowClass = "darktable",
