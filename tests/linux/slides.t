@@ -76,3 +76,16 @@ tell Slidewell to start slideshow
 front nobody
 tell Slidewell to start slideshow
   evince: Activate win.presentation of Other
+
+# Where a step leaves the picture away, the key for it comes first.
+program okular
+window Book of okular class=okular
+window Pages of okular class=okular full-screen
+front Pages
+tap playpause
+  window Pages: key b
+tap next
+  window Pages: key b
+  window Pages: key Right
+press rewind
+  window Pages: key Home

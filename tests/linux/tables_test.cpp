@@ -70,8 +70,13 @@ constexpr OwnWord kOwnWords[] = {
 };
 
 /// Of these, and of no word, the rows in prose tell.
-constexpr Code kToldInProse[] = {
-    0, words::kNextChapter, words::kPreviousChapter, words::kFirstSlide, words::kLastSlide, words::kFreeze};
+constexpr Code kToldInProse[] = {0,
+                                 words::kNextChapter,
+                                 words::kPreviousChapter,
+                                 words::kFirstSlide,
+                                 words::kLastSlide,
+                                 words::kFreeze,
+                                 words::kThaw};
 
 struct Row {
   std::string word, on, text;

@@ -31,6 +31,8 @@ inline constexpr Code kLastSlide = code("sLst");
 
 /// Takes the picture of a show away or brings it back.
 inline constexpr Code kFreeze = code("sFrz");
+/// Brings it back, where a step or a jump does not.
+inline constexpr Code kThaw = code("sThw");
 
 /// The word for a key, held with Shift or not; 0 for the many keys that no program takes differently.
 Code wordForKey(std::uint16_t virtualKey, bool withShift);

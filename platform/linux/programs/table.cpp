@@ -109,6 +109,7 @@ constexpr Program kPrograms[] = {
      .actions = {{
          {slidewell::kStart, Means::Method, "org.kde.okular-% /okular org.kde.okular slotTogglePresentation"},
          {slidewell::kStart, Means::Key, "Control+Shift+p"},
+         {words::kThaw, Means::Key, "b"},
      }}},
 
     {.role = Role::PhotoLibrary, .name = "Eye of GNOME", .entry = "org.gnome.eog", .windowClass = "eog", .show = ShowStyle::ActionState, .showAction = "win.view-slideshow",

@@ -50,6 +50,7 @@ class Presentation final : public RoleApplication {
   void start(const Performer& performer);
   void stop(const Performer& performer);
   void jump(const Performer& performer, const Event& event);
+  void move(const Performer& performer, tarnscript::Code word);
 
   /// The show whose picture was taken away with the key for it. Programs do not tell, so it is remembered;
   /// the next show has another window or begins unfrozen.
@@ -108,9 +109,7 @@ Value Presentation::performBy(const Performer& performer, const Event& event) {
       return {};
     case slidewell::kShowNext:
     case slidewell::kShowPrevious:
-      roles::perform(shown(performer), event.command);
-      // A step brings the picture back.
-      frozenIn_ = {};
+      move(performer, event.command);
       return {};
     default:
       return RoleApplication::performBy(performer, event);
@@ -142,7 +141,16 @@ void Presentation::jump(const Performer& performer, const Event& event) {
   if (slide == nullptr || slide->application != this || slide->cls != slidewell::kSlide) {
     throw Refusal{"only slides can be shown"};
   }
-  roles::perform(shown(performer), slide->id == kFirstSlide ? words::kFirstSlide : words::kLastSlide);
+  move(performer, slide->id == kFirstSlide ? words::kFirstSlide : words::kLastSlide);
+}
+
+/// A step or a jump, which brings the picture back.
+void Presentation::move(const Performer& performer, tarnscript::Code word) {
+  const Performer show = shown(performer);
+  if (isFrozen(&show.windows().front()) && programs::hasOwnAction(show.program(), words::kThaw)) {
+    roles::perform(show, words::kThaw);
+  }
+  roles::perform(show, word);
   frozenIn_ = {};
 }
 
