@@ -19,7 +19,7 @@ enum Quirk : std::uint8_t {
   kNeedsMedia = 16,
   /// An extension that speaks for a browser, which may speak for itself too.
   kSpeaksForBrowser = 32,
-  /// After quick seeks while it plays it may stand still for good, and say that it plays.
+  /// After seeks while it plays it may stand still for good, and say that it plays; quick ones most of all.
   kStallsOnSeeks = 64,
 };
 using Quirks = std::uint8_t;
