@@ -4,8 +4,6 @@
 
 #include <gtest/gtest.h>
 
-#include <filesystem>
-#include <fstream>
 
 #include "platform/base/values.h"
 #include "platform/stage/report.h"
@@ -103,31 +101,6 @@ TEST(Registry, ReadsTheMajorVersion) {
               return stage::aliveText();
             }),
             "string ×3, list ×1, serial number ×1");
-}
-
-TEST(Registry, ReadsAPropertyListFromABundle) {
-  EXPECT_EQ(inChild([] {
-              const auto directory =
-                  std::filesystem::temp_directory_path() / ("kvd-bundle-" + std::to_string(getpid()));
-              std::filesystem::create_directories(directory);
-              std::ofstream(directory / "Good.plist") << "<plist version=\"1.0\"><dict><key>k</key>"
-                                                         "<string>v</string></dict></plist>";
-              std::ofstream(directory / "Bad.plist") << "<plist><dict>";
-              const HostBundleRef bundle = HostCreateBundle(directory.c_str());
-              std::string answers;
-              for (const char* name : {"Good", "Bad", "Missing"}) {
-                const HostDictionaryRef list = CreateDictionaryFromPList(bundle, HostGetConstantString(name));
-                answers +=
-                    list
-                        ? base::textOf(HostAsString(HostDictionaryGetValue(list, HostGetConstantString("k"))))
-                        : std::string("-");
-                HostRelease(list);
-              }
-              HostRelease(bundle);
-              std::filesystem::remove_all(directory);
-              return answers + " " + stage::aliveText();
-            }),
-            "v-- nothing");
 }
 
 TEST(Bridge, TurnsResultsIntoNumbersAndCodes) {

@@ -1,19 +1,6 @@
 """The volume: of the desktop, and of a player when the desktop's is at its top."""
-from desktop import lasts, wait
+from desktop import wait
 from programs import Mpv, Strawberry
-
-
-def held_volume_goes_on_until_release(desktop):
-    desktop.start_kvd()
-    for button, start, reached in (("volume-up", 20, lambda: desktop.volume() >= 40),
-                                   ("down", 80, lambda: desktop.volume() <= 60)):
-        desktop.volume(start)
-        desktop.press(button, "--press")
-        wait(reached, f"{button} is repeated")
-        desktop.press(button, "--release")
-        # A button that is held is repeated for 10 s at most.
-        wait(lambda: desktop.volume(start) == start and lasts(lambda: desktop.volume() == start),
-             "the volume stands still after the release", 8)
 
 
 def volume_goes_by_five_within_its_limits(desktop):

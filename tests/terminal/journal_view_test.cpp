@@ -58,16 +58,4 @@ TEST(JournalView, ShowsScriptsInFullOnDemand) {
             (Lines{L"  script to A:", L"    tell A", L"    b", L"    c", L"    end", L"    = 1"}));
 }
 
-TEST(JournalView, ScrollsBackNoFartherThanItsBeginning) {
-  const JournalView view = viewOf("abcde");
-  EXPECT_EQ(shown(view, 2), (Lines{L"  d", L"  e"}));
-  EXPECT_EQ(shown(view, 2, 2), (Lines{L"  b", L"  c"}));
-  int back = 99;
-  view.show(2, 20, back, false);
-  EXPECT_EQ(back, 3);
-  back = -1;
-  EXPECT_EQ(view.show(9, 20, back, false).size(), 5u);
-  EXPECT_EQ(back, 0);
-}
-
 }  // namespace

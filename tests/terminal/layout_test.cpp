@@ -4,7 +4,6 @@
 
 #include <vector>
 
-#include "platform/terminal/application_rows.h"
 
 namespace {
 
@@ -51,24 +50,6 @@ TEST(Layout, ShowsTheWholeRemoteAndTheJournalAtTheSide) {
     EXPECT_EQ(layout.journal.top, layout.applications.top);
     EXPECT_EQ(layout.otherKeys.rows, rows > 24 ? 5 : 0);
   }
-}
-
-TEST(ApplicationRows, GiveWayFromTheEndButTheOneInFrontLast) {
-  terminal::ApplicationRow running;
-  running.mark = terminal::Mark::Runs;
-  running.state = {L"plays", L"on"};
-  std::vector<terminal::ApplicationRow> rows(3, running);
-  rows[2].mark = terminal::Mark::InFront;
-  terminal::fit(rows, 6);
-  EXPECT_EQ(rows[1].state.size(), 1u);
-  EXPECT_EQ(rows[2].state.size(), 1u);
-  terminal::fit(rows, 5);
-  EXPECT_EQ(rows[1].details, L"plays");
-  EXPECT_EQ(rows[2].state.size(), 1u);
-  rows[0].mark = terminal::Mark::None;
-  terminal::fit(rows, 2);
-  EXPECT_EQ(rows[1].details, L"plays");
-  EXPECT_EQ(rows.size(), 2u);
 }
 
 }  // namespace

@@ -31,12 +31,4 @@ TEST_F(Text, IsCutByColumns) {
   }
 }
 
-TEST_F(Text, BreaksAtBlanksElseAnywhere) {
-  using Lines = std::vector<std::wstring>;
-  EXPECT_EQ(terminal::wrap(L"", 10, 2), Lines{L""});
-  EXPECT_EQ(terminal::wrap(L"asks who is there", 10, 2), (Lines{L"asks who", L"  is there"}));
-  EXPECT_EQ(terminal::wrap(L"abcdefghij", 4, 1), (Lines{L"abcd", L" efg", L" hij"}));
-  EXPECT_EQ(terminal::wrap(L"日本語", 1, 5), (Lines{L"日", L"本", L"語"}));
-}
-
 }  // namespace
