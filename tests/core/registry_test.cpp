@@ -4,7 +4,6 @@
 
 #include <gtest/gtest.h>
 
-
 #include "platform/base/values.h"
 #include "platform/stage/report.h"
 #include "registry/bridge.h"
