@@ -7,7 +7,7 @@ PAUSED = {"PlaybackStatus": "Paused"}
 
 
 def play_and_pause(desktop):
-    music = Strawberry(desktop, rests="Stop")
+    music = Strawberry(desktop)
     desktop.start_kvd()
     music.follow(("playpause", {**PLAYING, "title": "Track 1"}), ("playpause", PAUSED), ("play", PLAYING),
                  ("pause", PAUSED), ("select", PLAYING), ("next", {**PLAYING, "title": "Track 2"}),

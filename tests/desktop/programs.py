@@ -84,7 +84,7 @@ class Player(Program):
 
 
 class Strawberry(Player):
-    def __init__(self, desktop, rests="Pause"):
+    def __init__(self, desktop):
         # Left to buffer after a seek, version 1.2 sometimes stands still and says that it plays.
         desktop.write(".config/strawberry/strawberry.conf",
                       "[Backend]\nbufferlowwatermark=0\nbufferhighwatermark=0.01\n")
@@ -92,9 +92,9 @@ class Strawberry(Player):
         # Version 1.2 takes no files when it is started. What it is told to open it plays.
         self.ask("call", "OpenUri", "s", f"file://{desktop.media}/music/all.m3u")
         self.become(CanGoNext=True, under_way=True)
-        # From a stop it now and then begins anew on a busy machine, says that it plays, and stands still.
-        self.ask("call", rests)
-        self.become(PlaybackStatus="Stopped" if rests == "Stop" else "Paused", settled=True)
+        # Begun anew after a Stop it says now and then, on a busy machine, that it plays, and stands still.
+        self.ask("call", "Pause")
+        self.become(PlaybackStatus="Paused", settled=True)
 
 
 class Mpv(Player):
