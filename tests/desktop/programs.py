@@ -1,4 +1,5 @@
 """The programs that play roles, each with something to play, and what they tell of themselves."""
+import glob
 import json
 import socket
 import time
@@ -85,16 +86,24 @@ class Player(Program):
 
 class Strawberry(Player):
     def __init__(self, desktop):
-        # Left to buffer after a seek, version 1.2 sometimes stands still and says that it plays.
-        desktop.write(".config/strawberry/strawberry.conf",
-                      "[Backend]\nbufferlowwatermark=0\nbufferhighwatermark=0.01\n")
-        super().__init__(desktop, "strawberry", "strawberry", "strawberry")
-        # Version 1.2 takes no files when it is started. What it is told to open it plays.
-        self.ask("call", "OpenUri", "s", f"file://{desktop.media}/music/all.m3u")
+        old = desktop.read("strawberry", "--version") < "Strawberry 1.2"
+        # Left to buffer after a seek, version 1.2 sometimes stands still and says that it plays; so does version 1.0
+        # when it is not left to.
+        if not old:
+            desktop.write(".config/strawberry/strawberry.conf",
+                          "[Backend]\nbufferlowwatermark=0\nbufferhighwatermark=0.01\n")
+        tracks = sorted(glob.glob(f"{desktop.media}/music/*.ogg"))
+        super().__init__(desktop, "strawberry", "strawberry", "strawberry", *(tracks if old else []))
+        if not old:
+            self.open(f"{desktop.media}/music/all.m3u")
+        self.become(CanGoNext=True, settled=True)
+
+    def open(self, path):
+        """Version 1.2 takes no files when it is started. What it is told to open it plays."""
+        self.ask("call", "OpenUri", "s", f"file://{path}")
         self.become(CanGoNext=True, under_way=True)
-        # Begun anew after a Stop it says now and then, on a busy machine, that it plays, and stands still.
-        self.ask("call", "Pause")
-        self.become(PlaybackStatus="Paused", settled=True)
+        self.ask("call", "Stop")
+        self.become(PlaybackStatus="Stopped")
 
 
 class Mpv(Player):
