@@ -1,9 +1,6 @@
 """Films and discs."""
-import time
-
 from desktop import wait
-from music import PLAYING
-from programs import Celluloid, Mpv, Strawberry, Vlc
+from programs import Celluloid, Mpv, Vlc
 
 ON, OFF = {"pause": False, "speed": 1.0}, {"pause": True, "speed": 1.0}
 
@@ -18,23 +15,6 @@ def scan_ends_in_the_state_before(desktop):
     wait(lambda: 0 < film.position() < 56, "the film goes back")
     film.follow(("rewind --release", ON))
     film.plays_on(beyond=30)
-
-
-def music_scans_by_seeking(desktop):
-    music = Strawberry(desktop)
-    desktop.start_kvd()
-    music.follow(("play", PLAYING))
-    music.skip(100)
-    began = time.monotonic()
-    desktop.press("forward", "--press")
-    wait(lambda: music.position() > 120 + time.monotonic() - began, "the track goes forward")
-    desktop.press("forward", "--release")
-    music.plays_on(beyond=120)
-    desktop.press("rewind", "--press")
-    wait(lambda: 0 < music.position() < 115, "the track goes back")
-    desktop.press("rewind", "--release")
-    music.plays_on(beyond=30)
-    music.become(PlaybackStatus="Playing", title="Track 1")
 
 
 def scan_rates_climb(desktop):

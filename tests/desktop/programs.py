@@ -65,10 +65,6 @@ class Player(Program):
         """Seconds; 0 when it does not tell. Strawberry also tells 0 in the midst of a seek."""
         return (self.get("Position") or 0) / 1e6
 
-    def skip(self, seconds):
-        self.ask("call", "Seek", "x", f"{seconds}000000")
-        wait(lambda: self.position() >= seconds, "it skips")
-
     def plays_on(self, beyond):
         """Waits until it goes on at about the normal speed, which must be beyond a position."""
         def at_ease():
