@@ -93,6 +93,13 @@ const Button* findButton(std::string_view name) {
   return found == kButtons.end() ? nullptr : found;
 }
 
+const Button* findButton(std::uint16_t usagePage, std::uint16_t usage) {
+  const auto* found = std::find_if(kButtons.begin(), kButtons.end(), [&](const Button& button) {
+    return button.usagePage == usagePage && button.usage == usage;
+  });
+  return found == kButtons.end() ? nullptr : found;
+}
+
 const Button& knownButton(std::string_view name) {
   if (const Button* button = findButton(name)) return *button;
   std::string nearest;

@@ -30,7 +30,10 @@ std::span<const Button> buttons();
 /// ("play-pause", "Play/Pause"); null when there is none.
 const Button* findButton(std::string_view name);
 
-/// The same for a name that must be one; throws UsageError with the nearest names.
+/// The button that sends this usage; null when there is none.
+const Button* findButton(std::uint16_t usagePage, std::uint16_t usage);
+
+/// The button with a name that must be one; throws UsageError with the nearest names.
 const Button& knownButton(std::string_view name);
 
 /// At most three names close to one that findButton does not know, nearest first.

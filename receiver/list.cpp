@@ -1,0 +1,101 @@
+#include "receiver/list.h"
+
+#include <cstdio>
+#include <exception>
+#include <string>
+
+#include "receiver/cec.h"
+#include "receiver/device.h"
+#include "receiver/devices.h"
+#include "receiver/holders.h"
+#include "receiver/names.h"
+#include "receiver/pass_through.h"
+#include "receiver/pass_through/protocol.h"
+
+namespace receiver {
+namespace {
+
+/// The keys that kvd does nothing with and the desktop does not get either, while a device is grabbed.
+std::string lostKeys(const Node& node, bool helper) {
+  constexpr int kMostNames = 8;
+  std::string names;
+  int count = 0;
+  const Keyboard keyboard{node.road, node.volumeKeys};
+  for (const std::uint16_t key : node.keys) {
+    if (buttonOf(key, std::nullopt, keyboard) != nullptr || (helper && pass_through::handsOn(key))) continue;
+    if (++count <= kMostNames) names += (names.empty() ? "" : ", ") + nameOf(key);
+  }
+  return count > kMostNames ? names + " and " + std::to_string(count - kMostNames) + " more" : names;
+}
+
+std::string advice(const Node& node) {
+  switch (node.verdict) {
+    case Verdict::Keyboard:
+    case Verdict::Mouse:
+    case Verdict::BesideKeyboard:
+    case Verdict::BesideMouse:
+    case Verdict::BesideSound:
+    case Verdict::Virtual:
+      return "if it is a remote: --device " + node.path + ", or a line in a file as 61-kvd-remotes.rules";
+    default:
+      return {};
+  }
+}
+
+/// What keeps a remote from being read; empty when nothing does.
+std::string obstacle(const Node& node) {
+  const Loop loop = makeLoop();
+  try {
+    Device device(loop.get(), node.path, {});
+    if (device.setGrabbed(true)) return {};
+    return "somebody else has grabbed it" + holdersOf(node.path);
+  } catch (const std::system_error& error) {
+    if (error.code() == std::errc::permission_denied) {
+      return "no permission: the rule 61-kvd-remotes.rules gives it to whoever sits at the screen (plug the "
+             "remote "
+             "in again after installing it); udevadm info " +
+             node.path + " tells more";
+    }
+    return error.code().message();
+  }
+}
+
+void print(const Node& node, const Arguments& arguments, bool helper) {
+  std::printf("%s\n", nameOf(node).c_str());
+  const std::string why(reason(node.verdict));
+  if (!isRemote(node.verdict)) {
+    std::printf("  no remote: %s\n", why.c_str());
+    if (const std::string what = advice(node); !what.empty()) std::printf("  %s\n", what.c_str());
+    return;
+  }
+  std::printf("  a remote: %s\n", why.c_str());
+  if (const std::string what = obstacle(node); !what.empty()) std::printf("  %s\n", what.c_str());
+  if (!arguments.grab) return;
+  if (const std::string keys = lostKeys(node, helper); !keys.empty()) {
+    std::printf("  lost while kvd has it: %s\n", keys.c_str());
+  }
+}
+
+}  // namespace
+
+int list(const Arguments& arguments) {
+  const bool helper = PassThrough(arguments.passThrough).open();
+  bool any = false;
+  for (const Node& node : findDevices(arguments.devices)) {
+    if (node.verdict == Verdict::NoButtons) continue;
+    print(node, arguments, helper);
+    any = true;
+  }
+  if (!any) std::puts("No input device has a button that kvd knows.");
+  for (const std::string& line : adaptersWithoutKeys()) std::puts(line.c_str());
+  if (arguments.grab && !helper) {
+    std::printf(
+        "Nobody hands keys on to the desktop: the helper on %s is not installed, or serves another user.\n",
+        arguments.passThrough.c_str());
+  }
+  if (std::fflush(stdout) == 0 && std::ferror(stdout) == 0) return 0;
+  std::perror("kvd-receiver: standard output");
+  return 1;
+}
+
+}  // namespace receiver
