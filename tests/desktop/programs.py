@@ -76,8 +76,8 @@ class Player(Program):
             raise Failed(f"it goes on at {reached} s")
 
     def under_way(self):
-        """Some players lose what they are told while they load."""
-        return self.position() > 0.1
+        """Some players lose what they are told while they load, and in the first moments after it."""
+        return self.position() > 0.5
 
 
 class Strawberry(Player):
