@@ -113,8 +113,6 @@ Receiver::Receiver(const Arguments& arguments)
     notifications_ = match(sessionBus_.get(), "interface='com.tarn.kvd.Notifications',member='Posted'",
                            handler<Receiver, &Receiver::takeNotification>, this);
   }
-  // Whoever has lost the system bus knows nothing of the session any more, and is to be started again.
-  if (systemBus_ != nullptr) sd_bus_set_exit_on_disconnect(systemBus_.get(), 1);
   session_.emplace(systemBus_.get(),
                    Session::Listener{[this](bool active) { setActive(active); },
                                      [this](bool locked) { lock_.setSessionLocked(locked); },
@@ -136,7 +134,7 @@ void setTimer(const Source& timer, Time due) {
 }
 
 void Receiver::endOnSignals() {
-  for (const int signal : {SIGTERM, SIGINT, SIGHUP}) {
+  for (const int signal : {SIGTERM, SIGINT, SIGHUP, SIGPIPE}) {
     sigset_t set;
     sigemptyset(&set);
     sigaddset(&set, signal);

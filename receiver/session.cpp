@@ -73,14 +73,20 @@ Session::Session(sd_bus* system, Listener listener) : bus_(system), listener_(st
     return;
   }
   ownerMatch_ =
-      match(bus_,
-            "sender='org.freedesktop.DBus',interface='org.freedesktop.DBus',member='NameOwnerChanged',"
-            "arg0='" +
-                std::string(kName) + "'",
-            handler<Session, &Session::askForUser>, this);
+      match(bus_, "sender='org.freedesktop.DBus',member='NameOwnerChanged',arg0='org.freedesktop.login1'",
+            handler<Session, &Session::takeOwner>, this);
+  loginMatch_ =
+      match(bus_, rule(kManagerPath, kManager, "UserNew"), handler<Session, &Session::askForUser>, this);
   sleepMatch_ = match(bus_, rule(kManagerPath, kManager, "PrepareForSleep"),
                       handler<Session, &Session::takeSleep>, this);
   askForUser(nullptr);
+}
+
+int Session::takeOwner(sd_bus_message* signal) {
+  const char* owner = nullptr;
+  if (sd_bus_message_read(signal, "sss", nullptr, nullptr, &owner) < 0) return 0;
+  // Until one that is started anew has come up, what the last one said stands.
+  return std::string_view(owner).empty() ? 0 : askForUser(nullptr);
 }
 
 int Session::askForUser(sd_bus_message* /*cause*/) {
@@ -94,6 +100,8 @@ int Session::takeUser(sd_bus_message* answer) {
   session_.clear();
   const char* path = nullptr;
   if (sd_bus_message_read(answer, "o", &path) >= 0) {
+    // Whoever loses the bus after this knows nothing of the session any more, and is to be started again.
+    sd_bus_set_exit_on_disconnect(bus_, 1);
     user_ = path;
     userMatch_ = match(bus_, rule(user_, kProperties, "PropertiesChanged"),
                        handler<Session, &Session::askForDisplay>, this);

@@ -24,12 +24,14 @@ class Session {
   };
 
   /// Asks over the system bus, which may be null, and follows what changes for as long as it lives. Where
-  /// there is no logind, the session counts as active.
+  /// there is no logind, the session counts as active. The loop ends with status 1 where a bus on which
+  /// logind has answered is lost.
   Session(sd_bus* system, Listener listener);
   Session(const Session&) = delete;
   Session& operator=(const Session&) = delete;
 
  private:
+  int takeOwner(sd_bus_message* signal);
   int askForUser(sd_bus_message* cause);
   int takeUser(sd_bus_message* answer);
   int askForDisplay(sd_bus_message* cause);
@@ -46,7 +48,7 @@ class Session {
   std::string session_;
   /// What LockedHint was.
   bool hint_ = false;
-  Slot ownerMatch_, sleepMatch_, userMatch_, stateMatch_, lockMatch_, unlockMatch_;
+  Slot ownerMatch_, loginMatch_, sleepMatch_, userMatch_, stateMatch_, lockMatch_, unlockMatch_;
   Slot userCall_, displayCall_, stateCall_;
 };
 
