@@ -3,7 +3,12 @@
 namespace receiver {
 namespace {
 
-std::string text(int result, const char* value) { return result >= 0 && value != nullptr ? value : ""; }
+/// What a getter of sd-device gives of a device; empty when it fails.
+template <typename Getter, typename... Name>
+std::string text(Getter get, sd_device* device, Name... name) {
+  const char* value = nullptr;
+  return get(device, name..., &value) >= 0 && value != nullptr ? value : "";
+}
 
 }  // namespace
 
@@ -20,19 +25,14 @@ void forEachDevice(const char* subsystem, const char* pattern, const std::functi
   }
 }
 
-std::string nodeOf(sd_device* device) {
-  const char* path = nullptr;
-  return text(sd_device_get_devname(device, &path), path);
-}
+std::string nodeOf(sd_device* device) { return text(sd_device_get_devname, device); }
 
 std::string attributeOf(sd_device* device, const char* name) {
-  const char* value = nullptr;
-  return device == nullptr ? "" : text(sd_device_get_sysattr_value(device, name, &value), value);
+  return device == nullptr ? "" : text(sd_device_get_sysattr_value, device, name);
 }
 
 bool hasFlag(sd_device* device, const char* name) {
-  const char* value = nullptr;
-  return text(sd_device_get_property_value(device, name, &value), value) == "1";
+  return text(sd_device_get_property_value, device, name) == "1";
 }
 
 sd_device* parentOf(sd_device* device, const char* subsystem, const char* type) {
@@ -41,8 +41,7 @@ sd_device* parentOf(sd_device* device, const char* subsystem, const char* type) 
 }
 
 std::string sysfsPathOf(sd_device* device) {
-  const char* path = nullptr;
-  return device == nullptr ? "" : text(sd_device_get_syspath(device, &path), path);
+  return device == nullptr ? "" : text(sd_device_get_syspath, device);
 }
 
 }  // namespace receiver
