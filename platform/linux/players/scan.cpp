@@ -120,15 +120,17 @@ void scan(Player& player, double rate) {
   if (!state.canSeek || state.status == PlaybackStatus::Stopped) {
     throw tarnscript::Refusal{"there is nothing to scan through"};
   }
+  const bool rests = (player.quirks & kStallsOnSeeks) != 0 && state.status == PlaybackStatus::Playing;
+  if (rests) {
+    pause(player);
+    state.status = PlaybackStatus::Paused;
+  }
   const HostTimerRef timer =
       HostCreateRepeatingTimer(HostAbsoluteTime() + kInterval, kInterval, tick, nullptr);
   if (!timer) throw tarnscript::Refusal{"there is no timer"};
-  const bool rests = (player.quirks & kStallsOnSeeks) != 0 && state.status == PlaybackStatus::Playing;
-  if (rests) state.status = PlaybackStatus::Paused;
   sScans.push_back({player.callee.name, rate, state.status, false, rests, rests, state.trackID, state.url,
                     state.position, base::Clock::now(), timer});
   HostRunLoopAddTimer(HostRunLoopCurrent(), timer, HostRunLoopMode::Default);
-  if (rests) pause(player);
 }
 
 void endScan(Player& player) {
