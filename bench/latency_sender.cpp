@@ -18,7 +18,6 @@
 #include <string>
 #include <vector>
 
-#include "messages/kvd_messages.h"
 #include "platform/mach.h"
 #include "remote/buttons.h"
 #include "remote/kvd_client.h"
@@ -79,12 +78,10 @@ int main(int argc, char** argv) {
   const std::string player = std::string("org.mpris.MediaPlayer2.") + argv[1];
   sd_bus* bus = nullptr;
   const char* unique = nullptr;
-  mach_port_t bootstrap = MACH_PORT_NULL;
   mach_port_t port = MACH_PORT_NULL;
   // A connection is open, and sends at once, when it knows its name.
   if (sd_bus_open_user(&bus) < 0 || sd_bus_get_unique_name(bus, &unique) < 0 ||
-      task_get_special_port(mach_task_self(), TASK_BOOTSTRAP_PORT, &bootstrap) != KERN_SUCCESS ||
-      bootstrap_look_up(bootstrap, kKVDServiceName, &port) != KERN_SUCCESS) {
+      kvd_look_up(&port) != KVD_SENT) {
     std::fputs("latency_sender: no session bus, or nobody is behind kvd's port\n", stderr);
     return 1;
   }

@@ -41,11 +41,8 @@ Port::Port(sd_event* loop, std::function<void()> changed) : changed_(std::move(c
 }
 
 void Port::lookUp() {
-  mach_port_t bootstrap = MACH_PORT_NULL;
-  port_ = MACH_PORT_NULL;
   lockTold_ = false;
-  if (task_get_special_port(mach_task_self(), TASK_BOOTSTRAP_PORT, &bootstrap) != KERN_SUCCESS) return;
-  if (bootstrap_look_up(bootstrap, kKVDServiceName, &port_) != KERN_SUCCESS) port_ = MACH_PORT_NULL;
+  if (kvd_look_up(&port_) != KVD_SENT) port_ = MACH_PORT_NULL;
 }
 
 void Port::lookAgain() {

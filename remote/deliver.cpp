@@ -38,12 +38,6 @@ int report(kern_return_t result) {
   }
 }
 
-kern_return_t findDaemon(mach_port_t* port) {
-  mach_port_t bootstrap = MACH_PORT_NULL;
-  const kern_return_t result = task_get_special_port(mach_task_self(), TASK_BOOTSTRAP_PORT, &bootstrap);
-  return result == KERN_SUCCESS ? bootstrap_look_up(bootstrap, kKVDServiceName, port) : result;
-}
-
 // The signals that would end this process; one that it was started to ignore, as under nohup, would not.
 sigset_t endingSignals() {
   sigset_t signals;
@@ -96,7 +90,7 @@ int sendButton(mach_port_t port, const Arguments& arguments) {
 
 int deliver(const Arguments& arguments) {
   mach_port_t port = MACH_PORT_NULL;
-  const kern_return_t found = findDaemon(&port);
+  const kern_return_t found = kvd_look_up(&port);
   if (found != KERN_SUCCESS) return report(found);
   switch (arguments.action) {
     case Action::SendButton:

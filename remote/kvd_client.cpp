@@ -1,6 +1,7 @@
 #include "remote/kvd_client.h"
 
 #include "messages/kvd_messages.h"
+#include "platform/mach.h"
 
 namespace {
 
@@ -16,7 +17,17 @@ mach_msg_return_t send(Request& request, mach_port_t port, mach_msg_id_t id) {
                   kKVDSendTimeout, MACH_PORT_NULL);
 }
 
+static_assert(KVD_SENT == KERN_SUCCESS && KVD_SENT == MACH_MSG_SUCCESS);
+static_assert(KVD_NOT_FOUND == BOOTSTRAP_UNKNOWN_SERVICE);
+static_assert(KVD_GONE == MACH_SEND_INVALID_DEST && KVD_QUEUE_FULL == MACH_SEND_TIMED_OUT);
+
 }  // namespace
+
+mach_msg_return_t kvd_look_up(mach_port_t* port) {
+  mach_port_t bootstrap = MACH_PORT_NULL;
+  const kern_return_t result = task_get_special_port(mach_task_self(), TASK_BOOTSTRAP_PORT, &bootstrap);
+  return result == KERN_SUCCESS ? bootstrap_look_up(bootstrap, kKVDServiceName, port) : result;
+}
 
 mach_msg_return_t kvd_terminate(mach_port_t port) {
   kvd_terminate_request_t request = {};

@@ -57,11 +57,7 @@ class Serving : public testing::Test {
     lookUp();
   }
 
-  void lookUp() {
-    mach_port_t bootstrap = MACH_PORT_NULL;
-    ASSERT_EQ(task_get_special_port(mach_task_self(), TASK_BOOTSTRAP_PORT, &bootstrap), KERN_SUCCESS);
-    ASSERT_EQ(bootstrap_look_up(bootstrap, kKVDServiceName, &port_), KERN_SUCCESS);
-  }
+  void lookUp() { ASSERT_EQ(kvd_look_up(&port_), KVD_SENT); }
 
   void sendButton(UsageKey key) {
     ASSERT_EQ(kvd_handlehidevent(port_, static_cast<std::uint16_t>(key >> 16),

@@ -65,10 +65,8 @@ void sayJournal() {
 
 template <typename... Fields>
 void send(mach_msg_return_t (*stub)(mach_port_t, Fields...), std::type_identity_t<Fields>... fields) {
-  mach_port_t bootstrap = MACH_PORT_NULL;
   mach_port_t port = MACH_PORT_NULL;
-  task_get_special_port(mach_task_self(), TASK_BOOTSTRAP_PORT, &bootstrap);
-  bootstrap_look_up(bootstrap, kKVDServiceName, &port);
+  kvd_look_up(&port);
   if (stub(port, fields...) != MACH_MSG_SUCCESS) throw UsageError("nobody listens");
 }
 
