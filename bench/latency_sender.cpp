@@ -1,13 +1,15 @@
-// latency_sender NAME: sends one press of Play/Pause for each line of its standard input, and writes the time
-// at which it set out, in nanoseconds on CLOCK_MONOTONIC. The line tells how: "call" calls the player NAME
+// latency_sender NAME...: sends one press of Play/Pause for each line of its standard input, and writes the
+// time at which it set out, in nanoseconds on CLOCK_MONOTONIC. The line tells how: "call" calls the players
 // over a connection to the session bus that is open, "button" sends to kvd's port, which is open too, "random
-// COUNT SEED" sends so many buttons there, and any other line is a program and its arguments, separated by
-// tabs, which is started and waited for.
+// COUNT SEED" sends so many buttons there, "key DESCRIPTOR" writes what the kernel tells of the press of a
+// key, and any other line is a program and its arguments, separated by tabs, which is started and waited for.
+#include <linux/input.h>
 #include <spawn.h>
 #include <sys/wait.h>
 #include <systemd/sd-bus.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cinttypes>
 #include <cstdint>
 #include <cstdio>
@@ -54,6 +56,20 @@ bool pressAtRandom(mach_port_t port, const std::string& line) {
   return true;
 }
 
+bool pressKey(const std::string& line) {
+  timespec now = {};
+  clock_gettime(CLOCK_BOOTTIME, &now);
+  input_event frame[2] = {};
+  for (input_event& event : frame) {
+    event.input_event_sec = now.tv_sec;
+    event.input_event_usec = now.tv_nsec / 1000;
+  }
+  frame[0].type = EV_KEY;
+  frame[0].code = KEY_PLAYPAUSE;
+  frame[0].value = 1;
+  return write(std::stoi(line.substr(line.find(' '))), frame, sizeof frame) == sizeof frame;
+}
+
 bool run(const std::string& line) {
   std::vector<std::string> words;
   std::istringstream stream(line);
@@ -71,12 +87,15 @@ bool run(const std::string& line) {
 }  // namespace
 
 int main(int argc, char** argv) {
-  if (argc != 2) {
-    std::fputs("Usage: latency_sender NAME\n", stderr);
+  if (argc < 2) {
+    std::fputs("Usage: latency_sender NAME...\n", stderr);
     return 2;
   }
-  const std::string player = std::string("org.mpris.MediaPlayer2.") + argv[1];
   sd_bus* bus = nullptr;
+  // The first one is called last, as kvd plays when it has silenced the others.
+  std::vector<std::string> players;
+  for (int i = argc - 1; i > 0; --i) players.push_back(std::string("org.mpris.MediaPlayer2.") + argv[i]);
+  const auto callPlayer = [&bus](const std::string& player) { return call(bus, player.c_str()); };
   const char* unique = nullptr;
   mach_port_t port = MACH_PORT_NULL;
   // A connection is open, and sends at once, when it knows its name.
@@ -88,8 +107,9 @@ int main(int argc, char** argv) {
   for (std::string line; std::getline(std::cin, line);) {
     timespec start = {};
     clock_gettime(CLOCK_MONOTONIC, &start);
-    const bool sent = line == "call"                ? call(bus, player.c_str())
+    const bool sent = line == "call"                ? std::ranges::all_of(players, callPlayer)
                       : line == "button"            ? press(port)
+                      : line.starts_with("key ")    ? pressKey(line)
                       : line.starts_with("random ") ? pressAtRandom(port, line)
                                                     : run(line);
     if (!sent) {
