@@ -12,6 +12,9 @@
 namespace base {
 namespace {
 
+/// Far longer than any message; of a longer one the rest is lost, and it is not trusted.
+constexpr std::size_t kLongest = 256;
+
 /// Port objects point into it, so its entries stay where they are.
 std::map<mach_port_t, ReceiveQueue>& queues() {
   static auto& all = *new std::map<mach_port_t, ReceiveQueue>;
@@ -28,11 +31,10 @@ std::optional<ucred> senderOf(msghdr& datagram) {
   return sender;
 }
 
-std::optional<Datagram> receive(int socket) {
-  const ssize_t length = recv(socket, nullptr, 0, MSG_PEEK | MSG_TRUNC | MSG_DONTWAIT);
-  if (length < 0) return std::nullopt;
-  Datagram received{.bytes = std::vector<std::byte>(static_cast<std::size_t>(length))};
-  iovec body{.iov_base = received.bytes.data(), .iov_len = received.bytes.size()};
+/// What comes next from the socket, trusted when this user or root has sent it.
+std::optional<Datagram> receive(int socket, uid_t user) {
+  std::array<std::byte, kLongest> bytes{};
+  iovec body{.iov_base = bytes.data(), .iov_len = bytes.size()};
   // Room for the credentials, which come first, and for nothing else: descriptors that somebody attached do
   // not fit, and the kernel closes them.
   alignas(cmsghdr) std::array<char, CMSG_SPACE(sizeof(ucred))> control{};
@@ -41,10 +43,12 @@ std::optional<Datagram> receive(int socket) {
   datagram.msg_iovlen = 1;
   datagram.msg_control = control.data();
   datagram.msg_controllen = control.size();
-  if (recvmsg(socket, &datagram, MSG_DONTWAIT | MSG_CMSG_CLOEXEC) < 0) return std::nullopt;
+  const ssize_t length = recvmsg(socket, &datagram, MSG_DONTWAIT | MSG_CMSG_CLOEXEC);
+  if (length < 0) return std::nullopt;
+  Datagram received{.bytes = {bytes.begin(), bytes.begin() + length}};
   if (const auto sender = senderOf(datagram)) {
     received.sender = sender->pid;
-    const bool friendly = sender->uid == geteuid() || sender->uid == 0;
+    const bool friendly = sender->uid == user || sender->uid == 0;
     received.trusted = friendly && (datagram.msg_flags & MSG_TRUNC) == 0;
   }
   return received;
@@ -52,12 +56,13 @@ std::optional<Datagram> receive(int socket) {
 
 }  // namespace
 
-ReceiveQueue::ReceiveQueue(FileDescriptor socket) : socket_(std::move(socket)), owner_(getpid()) {}
+ReceiveQueue::ReceiveQueue(FileDescriptor socket)
+    : socket_(std::move(socket)), owner_(getpid()), user_(geteuid()) {}
 
 bool ReceiveQueue::isOurs() const { return owner_ == getpid(); }
 
 std::optional<Datagram> ReceiveQueue::take() {
-  if (readAhead_.empty()) return receive(socket_.get());
+  if (readAhead_.empty()) return receive(socket_.get(), user_);
   Datagram oldest = std::move(readAhead_.front());
   readAhead_.pop_front();
   return oldest;
@@ -65,7 +70,7 @@ std::optional<Datagram> ReceiveQueue::take() {
 
 bool ReceiveQueue::drain() {
   const std::size_t before = readAhead_.size();
-  while (auto datagram = receive(socket_.get())) readAhead_.push_back(std::move(*datagram));
+  while (auto datagram = receive(socket_.get(), user_)) readAhead_.push_back(std::move(*datagram));
   return readAhead_.size() > before;
 }
 

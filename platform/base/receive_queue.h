@@ -39,6 +39,7 @@ class ReceiveQueue {
  private:
   FileDescriptor socket_;
   pid_t owner_;
+  uid_t user_;
   std::deque<Datagram> readAhead_;
 };
 

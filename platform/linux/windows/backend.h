@@ -27,7 +27,8 @@ struct Backend {
   bool (*open)();
   /// Closes the connection for good.
   void (*close)();
-  /// Takes in what the window system has sent. True when the list has changed since the last call.
+  /// Opens it and takes in what the window system has sent. True when the list has changed since the last
+  /// call.
   bool (*takeIn)();
   /// The windows that the person has open, topmost first. Valid until takeIn.
   const std::vector<Window>& (*list)();

@@ -145,7 +145,6 @@ bool isOpen() {
 bool takeIn() {
   bool changed = false;
   for (const Backend* backend : sBackends) {
-    backend->open();
     changed |= backend->takeIn();
   }
   if (changed) merge();
