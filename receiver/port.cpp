@@ -28,13 +28,17 @@ bool isService(const inotify_event& event) {
 
 Port::Port(sd_event* loop, std::function<void()> changed) : changed_(std::move(changed)) {
   if (const auto directory = base::serviceDirectory(base::Side::Sends)) {
+    constexpr std::uint32_t kComes = IN_CREATE | IN_MOVED_TO;
+    constexpr std::uint32_t kGoes = IN_DELETE | IN_MOVED_FROM;
     const auto look = [](sd_event_source*, const inotify_event* event, void* self) {
-      if (isService(*event)) static_cast<Port*>(self)->lookAgain();
+      if (!isService(*event)) return 0;
+      auto* const port = static_cast<Port*>(self);
+      // The news of one that has come by now follows, and is enough.
+      (event->mask & kComes) != 0 ? port->lookAgain() : port->lose();
       return 0;
     };
     sd_event_source* watch = nullptr;
-    constexpr std::uint32_t kComesOrGoes = IN_CREATE | IN_DELETE | IN_MOVED_FROM | IN_MOVED_TO;
-    sd_event_add_inotify(loop, &watch, directory->c_str(), kComesOrGoes, look, this);
+    sd_event_add_inotify(loop, &watch, directory->c_str(), kComes | kGoes, look, this);
     watch_.reset(watch);
   }
   lookUp();
@@ -52,6 +56,12 @@ void Port::lookAgain() {
   if (!isOpen()) return;
   tellLock();
   sendWaiting();
+}
+
+void Port::lose() {
+  const bool wasOpen = isOpen();
+  port_ = MACH_PORT_NULL;
+  if (wasOpen) changed_();
 }
 
 void Port::tellLock() {

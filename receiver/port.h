@@ -43,6 +43,7 @@ class Port {
 
   void lookUp();
   void lookAgain();
+  void lose();
   bool send(const remote::Button& button, std::int32_t value);
   void tellLock();
   void sendWaiting();
