@@ -30,11 +30,15 @@ is_installed() {
         [[ -e /usr/local/include/gtest/gtest.h ]]
       ;;
     libncurses-dev) [[ -e /usr/include/ncurses.h || -e /usr/include/curses.h ]] ;;
+    libevdev-dev) pkg-config --exists libevdev ;;
     libsystemd-dev) pkg-config --exists libsystemd ;;
     libxcb*-dev) pkg-config --exists xcb xcb-randr xcb-res ;;
     libpulse-dev) pkg-config --exists libpulse ;;
     libglib2.0-dev) pkg-config --exists gio-unix-2.0 ;;
     nlohmann-json3-dev) pkg-config --exists nlohmann_json ;;
+    umockdev) command -v umockdev-wrapper >/dev/null ;;
+    gir1.2-umockdev-1.0) /usr/bin/python3 -c 'import gi; gi.require_version("UMockdev", "1.0")' 2>/dev/null ;;
+    python3-gi | python3-dbusmock) /usr/bin/python3 -c "import ${package#python3-}" 2>/dev/null ;;
     *)
       program=$(sed -n "s/^$package //p" tests/desktop/packages)
       command -v "${program:-$package}" >/dev/null || [[ -e "${program:-$package}" ]]
