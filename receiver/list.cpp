@@ -1,5 +1,6 @@
 #include "receiver/list.h"
 
+#include <chrono>
 #include <cstdio>
 #include <exception>
 #include <string>
@@ -14,6 +15,9 @@
 
 namespace receiver {
 namespace {
+
+/// A helper is started within a fraction of this.
+constexpr std::chrono::milliseconds kPatience{2000};
 
 /// The keys that kvd does nothing with and the desktop does not get either, while a device is grabbed.
 std::string lostKeys(const Node& node, bool helper) {
@@ -79,7 +83,8 @@ void print(const Node& node, const Arguments& arguments, bool helper) {
 }  // namespace
 
 int list(const Arguments& arguments) {
-  const bool helper = PassThrough(arguments.passThrough).open();
+  PassThrough passThrough(arguments.passThrough);
+  const bool helper = passThrough.open() && passThrough.serves(kPatience);
   bool any = false;
   for (const Node& node : findDevices(arguments.devices)) {
     if (node.verdict == Verdict::NoButtons) continue;

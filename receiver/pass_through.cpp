@@ -1,5 +1,6 @@
 #include "receiver/pass_through.h"
 
+#include <poll.h>
 #include <sys/socket.h>
 #include <sys/un.h>
 
@@ -22,6 +23,13 @@ bool PassThrough::open() {
   return true;
 }
 
+bool PassThrough::serves(std::chrono::milliseconds patience) {
+  pollfd answer{connection_.get(), POLLIN, 0};
+  std::uint8_t word = 0;
+  return poll(&answer, 1, static_cast<int>(patience.count())) == 1 &&
+         recv(connection_.get(), &word, sizeof word, 0) == sizeof word && word == pass_through::kReady;
+}
+
 void PassThrough::close() {
   connection_ = base::FileDescriptor();
   pressed_.clear();
@@ -33,10 +41,10 @@ bool PassThrough::send(std::uint16_t key, std::uint16_t value) {
 }
 
 bool PassThrough::press(Key key) {
-  if (!pass_through::handsOn(key.code)) return false;
+  if (!pass_through::handsOn(key.code) || !open()) return false;
   bool sent = send(key.code, 1);
-  if (!sent) {
-    // A helper that has ended is started anew by the next connection.
+  if (!sent && serves(std::chrono::milliseconds(0))) {
+    // The next connection starts it anew. One that has refused to serve would refuse again.
     close();
     sent = open() && send(key.code, 1);
   }

@@ -1,9 +1,11 @@
 // The receiver's end of the connection to the helper that hands keys on to the desktop.
 #pragma once
 
+#include <chrono>
 #include <cstdint>
 #include <set>
 #include <string>
+#include <utility>
 
 #include "platform/base/file_descriptor.h"
 #include "receiver/holds.h"
@@ -16,8 +18,12 @@ class PassThrough {
   explicit PassThrough(std::string socket) : socket_(std::move(socket)) {}
 
   /// Connects, so that the desktop knows the helper's device before a key comes. False where there is no
-  /// helper, or it does not serve this user.
+  /// helper; whether it serves this user it says later.
   bool open();
+
+  /// Whether the helper has said that it serves this user, or says so within this time. To be asked once of a
+  /// connection.
+  bool serves(std::chrono::milliseconds patience);
 
   /// Ends the connection, and with it whatever is pressed.
   void close();

@@ -3,7 +3,8 @@
 // The receiver keeps remotes to itself, so that a press is not acted upon twice. Keys that kvd has no use for
 // must reach the desktop all the same: the helper, which alone may open /dev/uinput, makes one input device
 // with exactly these keys and presses on it what comes in over its connection. The device goes with the
-// connection.
+// connection. The descriptor stays with the helper: whoever has it can make another device of it, with any
+// keys.
 #pragma once
 
 #include <linux/input-event-codes.h>
@@ -16,6 +17,9 @@ namespace receiver::pass_through {
 
 /// Where the helper listens: sequenced packets, a KeyPress each.
 inline constexpr char kSocket[] = "/run/kvd/pass-through";
+
+/// The packet that the helper sends when its device is there; whom it does not serve it sends none.
+inline constexpr std::uint8_t kReady = 1;
 
 /// A key went down (1) or came up (0).
 struct KeyPress {
