@@ -75,7 +75,7 @@ std::optional<Node> describe(sd_device* device, const std::vector<std::string>& 
   // As udev itself finds out which input devices are keyboards and mice; what it found is not there before
   // its rules have run.
   const auto axes = bitsOf(attributeOf(parent, "capabilities/rel"));
-  node.keyboard = hasFlag(device, "ID_INPUT_KEYBOARD") || hasAll(node.keys, KEY_ESC, KEY_D);
+  node.keyboard = hasFlag(device, "ID_INPUT_KEYBOARD") || hasAll(node.keys, KEY_ESC, KEY_S);
   node.mouse = hasFlag(device, "ID_INPUT_MOUSE") || (has(axes, REL_X) && has(node.keys, BTN_LEFT));
   node.marked = hasFlag(device, "ID_REMOTE_CONTROL");
   node.named = std::ranges::any_of(named, [&node](const std::string& word) { return isCalled(node, word); });
