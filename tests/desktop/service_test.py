@@ -183,6 +183,12 @@ def play(session):
     session.systemctl("unset-environment", "DBUS_SESSION_BUS_ADDRESS")
     wait(lambda: session.volume() == "85%", "the message was handled after all")
 
+    print("the receiver reaches the bus from its confinement, and ends in peace")
+    session.systemctl("enable", "--now", "kvd-receiver.service")
+    wait(lambda: "kvd-receiver" in session.run("busctl", "--user", "--unique"), "it is on the bus")
+    session.systemctl("stop", "kvd-receiver.service")
+    assert session.show("kvd-receiver.service", "Result") == "success"
+
 
 def main():
     missing = [name for name in ("busctl", "cmake", "dbus-daemon", "pactl", "pulseaudio", "systemctl", "unshare")
