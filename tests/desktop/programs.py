@@ -83,11 +83,8 @@ class Player(Program):
 class Strawberry(Player):
     def __init__(self, desktop):
         old = desktop.read("strawberry", "--version") < "Strawberry 1.2"
-        # Left to buffer after a seek, version 1.2 sometimes stands still and says that it plays; so does version 1.0
-        # when it is not left to.
-        if not old:
-            desktop.write(".config/strawberry/strawberry.conf",
-                          "[Backend]\nbufferlowwatermark=0\nbufferhighwatermark=0.01\n")
+        # Left to buffer, it sometimes stands still and says that it plays.
+        desktop.write(".config/strawberry/strawberry.conf", "[Backend]\nbufferduration=0\n")
         tracks = sorted(glob.glob(f"{desktop.media}/music/*.ogg"))
         super().__init__(desktop, "strawberry", "strawberry", "strawberry", *(tracks if old else []))
         if not old:
