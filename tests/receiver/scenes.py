@@ -248,6 +248,7 @@ def pass_through(stand):
     remote = Device("rc0", "Remote", "PLAY MUTE 5 A POWER", **IR)
     stand.receive()
     connection, _ = helper.accept()
+    connection.send(b"\1")
 
     def hands_on(*keys):
         for key, value in keys:
@@ -259,7 +260,7 @@ def pass_through(stand):
     remote.send(("MUTE", 1), ("MUTE", 2), ("MUTE", 0), ("PLAY", 1), ("PLAY", 0), ("A", 1), ("A", 0), ("5", 1))
     stand.says("play down")
     hands_on(("MUTE", 1), ("MUTE", 0), ("5", 1))
-    # One that has ended is called again.
+    # One that served and has ended is called again.
     connection.close()
     remote.tap("POWER")
     connection, _ = helper.accept()
