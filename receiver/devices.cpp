@@ -66,6 +66,8 @@ std::optional<Node> describe(sd_device* device, const std::vector<std::string>& 
   if (node.path.empty()) return std::nullopt;
   sd_device* const parent = parentOf(device, "input");
   node.name = attributeOf(parent, "name");
+  node.vendor = attributeOf(parent, "id/vendor");
+  node.product = attributeOf(parent, "id/product");
   node.keys = bitsOf(attributeOf(parent, "capabilities/key"));
   const unsigned long bus = hexadecimal(attributeOf(parent, "id/bustype"));
   node.road = roadOf(device, node.name, bus);

@@ -32,18 +32,24 @@ std::string lostKeys(const Node& node, bool helper) {
   return count > kMostNames ? names + " and " + std::to_string(count - kMostNames) + " more" : names;
 }
 
+/// The line of a udev rule that makes a remote of a device, and gives it to whoever sits at the screen.
+std::string ruleFor(const Node& node) {
+  return "this line in /etc/udev/rules.d/62-my-remotes.rules:\n"
+         "    SUBSYSTEM==\"input\", KERNEL==\"event*\", ATTRS{id/vendor}==\"" +
+         node.vendor + "\", ATTRS{id/product}==\"" + node.product + "\", ENV{ID_REMOTE_CONTROL}=\"1\"";
+}
+
 std::string advice(const Node& node) {
-  switch (node.verdict) {
-    case Verdict::Keyboard:
-    case Verdict::Mouse:
-    case Verdict::BesideKeyboard:
-    case Verdict::BesideMouse:
-    case Verdict::BesideSound:
-    case Verdict::Virtual:
-      return "if it is a remote: --device " + node.path + ", or a line in a file as 61-kvd-remotes.rules";
-    default:
-      return {};
-  }
+  const std::string option = "if it is a remote: --device " + node.path;
+  return node.verdict == Verdict::Virtual ? option : option + ", or " + ruleFor(node);
+}
+
+std::string permission(const Node& node) {
+  const std::string none = "no permission: ";
+  if (node.marked) return none + "udev gives it to whoever sits at the screen";
+  if (node.road == Road::HID) return none + "it takes " + ruleFor(node);
+  return none +
+         "the rule 61-kvd-remotes.rules gives it to whoever sits at the screen, once it is plugged in again";
 }
 
 /// What keeps a remote from being read; empty when nothing does.
@@ -51,16 +57,9 @@ std::string obstacle(const Node& node) {
   const Loop loop = makeLoop();
   try {
     Device device(loop.get(), node.path, {});
-    if (device.setGrabbed(true)) return {};
-    return "somebody else has grabbed it" + holdersOf(node.path);
+    return device.setGrabbed(true) ? "" : "somebody else has grabbed it" + holdersOf(node.path);
   } catch (const std::system_error& error) {
-    if (error.code() == std::errc::permission_denied) {
-      return "no permission: the rule 61-kvd-remotes.rules gives it to whoever sits at the screen (plug the "
-             "remote "
-             "in again after installing it); udevadm info " +
-             node.path + " tells more";
-    }
-    return error.code().message();
+    return error.code() == std::errc::permission_denied ? permission(node) : error.code().message();
   }
 }
 
@@ -69,7 +68,7 @@ void print(const Node& node, const Arguments& arguments, bool helper) {
   const std::string why(reason(node.verdict));
   if (!isRemote(node.verdict)) {
     std::printf("  no remote: %s\n", why.c_str());
-    if (const std::string what = advice(node); !what.empty()) std::printf("  %s\n", what.c_str());
+    std::printf("  %s\n", advice(node).c_str());
     return;
   }
   std::printf("  a remote: %s\n", why.c_str());

@@ -36,6 +36,9 @@ struct Node {
   /// /dev/input/eventN.
   std::string path;
   std::string name;
+  /// Who made it and what it is, as udev rules say it: four hexadecimal digits each.
+  std::string vendor;
+  std::string product;
   Road road = Road::HID;
   /// The physical device that it belongs to, with others perhaps; empty for those of no USB or Bluetooth
   /// device.
