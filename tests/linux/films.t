@@ -80,3 +80,10 @@ wait 0.25s
   +0.25s  celluloid: SetPosition /track/1 3784.5s
 tap playpause
   celluloid: channel: show-text dune 1.mkv|1:03:04 / 2:00:00
+quit celluloid
+
+# Milliseconds for one that counts them.
+player showtime as=org.gnome.Showtime length=7.2s Position=0.06s playing
+tap next
+  desk: Notify kvd 7 org.gnome.Showtime Showtime 1:00 / 2:00:00 2000
+  showtime: SetPosition /track/1 0.07s

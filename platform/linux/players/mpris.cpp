@@ -24,6 +24,9 @@ using system::readText;
 /// Longer than anything that is played, in microseconds: times beyond it are garbage.
 constexpr double kLongestTime = 1e6 * 3600 * 1000;
 
+/// No film is so short, in microseconds: its player counts milliseconds.
+constexpr std::int64_t kShortestFilm = 30'000'000;
+
 constexpr double kFastestRate = 100;
 /// Players that can amplify go a little above 1.
 constexpr double kLoudest = 10;
@@ -167,6 +170,11 @@ PlayerState stateOf(Player& player) {
   readDictionary(answer.get(), [&](std::string_view key, std::string_view type) {
     readProperty(answer.get(), key, type, state);
   });
+  if ((player.quirks & kCountsMilliseconds) != 0 && state.length && *state.length < kShortestFilm) {
+    state.tick = 1000;
+    state.position *= state.tick;
+    *state.length *= state.tick;
+  }
   state.status = believedCommand(player).value_or(state.told);
   return state;
 }
@@ -270,10 +278,11 @@ void seekTo(Player& player, const PlayerState& state, std::int64_t position) {
   position = std::max<std::int64_t>(position, 0);
   believe(player, state.status);
   if (state.trackID.empty()) {
-    command(player, {mpris::kPath, mpris::kPlayerInterface, "Seek"}, "x", position - state.position);
+    command(player, {mpris::kPath, mpris::kPlayerInterface, "Seek"}, "x",
+            (position - state.position) / state.tick);
   } else {
     command(player, {mpris::kPath, mpris::kPlayerInterface, "SetPosition"}, "ox", state.trackID.c_str(),
-            position);
+            position / state.tick);
   }
 }
 

@@ -27,6 +27,8 @@ struct PlayerState {
   double maximumRate = 1;
   std::int64_t position = 0;
   std::optional<std::int64_t> length;
+  /// How many microseconds the player takes for one.
+  std::int64_t tick = 1;
   /// An object path, "" where the player has none that can be sent back to it.
   std::string trackID;
   /// The name of the file where what plays has no title.

@@ -21,6 +21,8 @@ enum Quirk : std::uint8_t {
   kSpeaksForBrowser = 32,
   /// After seeks while it plays it may stand still for good, and say that it plays; quick ones most of all.
   kStallsOnSeeks = 64,
+  /// Its older versions tell and take milliseconds where microseconds are meant.
+  kCountsMilliseconds = 128,
 };
 using Quirks = std::uint8_t;
 

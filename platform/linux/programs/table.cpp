@@ -16,6 +16,7 @@ namespace linux::programs {
 namespace {
 
 using players::ChannelKind;
+using players::kCountsMilliseconds;
 using players::kIgnoresPlay;
 using players::kIgnoresRaise;
 using players::kIgnoresRate;
@@ -84,7 +85,7 @@ constexpr Program kPrograms[] = {
     {.role = Role::ModernMovies, .name = "Totem", .entry = "org.gnome.Totem", .busName = "totem", .windowClass = "totem", .quirks = kStallsOnSeeks},
     {.role = Role::ModernMovies, .name = "Haruna", .entry = "org.kde.haruna", .busName = "haruna", .windowClass = "haruna"},
     {.role = Role::ModernMovies, .name = "Clapper", .entry = "com.github.rafostar.Clapper", .busName = "Clapper", .windowClass = "com.github.rafostar.Clapper", .quirks = kStallsOnSeeks},
-    {.role = Role::ModernMovies, .name = "Showtime", .entry = "org.gnome.Showtime", .busName = "Showtime", .windowClass = "org.gnome.Showtime"},
+    {.role = Role::ModernMovies, .name = "Showtime", .entry = "org.gnome.Showtime", .busName = "org.gnome.Showtime", .windowClass = "org.gnome.Showtime", .quirks = kCountsMilliseconds},
     {.role = Role::ModernMovies, .name = "Dragon Player", .entry = "org.kde.dragonplayer", .busName = "dragonplayer", .windowClass = "dragonplayer"},
     {.role = Role::ModernMovies, .name = "Parole", .entry = "org.xfce.Parole", .busName = "parole", .windowClass = "parole"},
     // Browsers. Stop would take what they play away.
@@ -103,6 +104,11 @@ constexpr Program kPrograms[] = {
     {.role = Role::Presentation, .name = "Evince", .entry = "org.gnome.Evince", .windowClass = "evince",
      .actions = {{
          {slidewell::kStart, Means::Action, "win.presentation"},
+     }}},
+    {.role = Role::Presentation, .name = "Papers", .entry = "org.gnome.Papers", .windowClass = "papers",
+     .actions = {{
+         {slidewell::kStart, Means::Action, "win.presentation"},
+         {slidewell::kStop, Means::Action, "win.escape"},
      }}},
     {.role = Role::Presentation, .name = "Atril", .entry = "atril", .windowClass = "atril"},
     {.role = Role::Presentation, .name = "Okular", .entry = "org.kde.okular", .windowClass = "okular", .show = ShowStyle::OwnWindow,
