@@ -160,16 +160,23 @@ def session(stand):
 
 def lock(stand):
     """The lock is said at the start, at each change, and to a daemon that does not know it."""
-    stand.log_in("LockedHint", True)
+    stand.log_in("LockedHint", False)
     bus = stand.start_bus("SESSION")
     gnome = "org.gnome.ScreenSaver"
     stand.mock(bus, gnome, "--session", gnome, "/org/gnome/ScreenSaver", gnome)
-    bus.get_object(gnome, "/org/gnome/ScreenSaver").AddMethod(
-        gnome, "GetActive", "", "b", "ret = True", dbus_interface="org.freedesktop.DBus.Mock")
+
+    def answer(active):
+        bus.get_object(gnome, "/org/gnome/ScreenSaver").AddMethod(
+            gnome, "GetActive", "", "b", f"ret = {active}", dbus_interface="org.freedesktop.DBus.Mock")
+
+    answer(True)
     stand.listen()
     remote = Device("rc0", "Remote", "PLAY", **IR)
     stand.receive()
-    stand.says("locked")
+    stand.shows('"Remote" is read')
+    # The login manager may answer before the screen saver.
+    while stand.message() != "locked":
+        pass
 
     def saver(name, active):
         return lambda: stand.signal(bus, f"/org/{name}/ScreenSaver", f"org.{name}.ScreenSaver", "ActiveChanged", active)
@@ -182,14 +189,17 @@ def lock(stand):
         return lambda: stand.logind(SESSION, "EmitSignal", f"{LOGIN}.Session", member, "", [])
 
     for change, *messages in [
-            (saver("gnome", True),), (lambda: stand.set("LockedHint", False),), (saver("gnome", False), "unlocked"),
-            (emit("Lock"), "locked"), (stand.listen, "locked"), (posted("started"), "locked"), (emit("Unlock"), "unlocked"),
+            (saver("gnome", False), "unlocked"), (emit("Lock"), "locked"), (stand.listen, "locked"), (posted("started"), "locked"), (emit("Unlock"), "unlocked"),
             (saver("freedesktop", True), "locked"), (saver("gnome", True),), (saver("freedesktop", False),),
             (saver("gnome", False), "unlocked"), (lambda: stand.set("LockedHint", True), "locked"),
             (posted("terminated"),), (lambda: remote.tap("PLAY"), "locked", "play down"),
             (emit("Unlock"), "unlocked"), (posted("terminated"),), (posted("started"),), (emit("Lock"), "locked")]:
         change()
         stand.says(*messages)
+    stand.end()
+    answer(False)
+    stand.receive()
+    stand.says("locked")
     stand.end()
 
 

@@ -75,7 +75,7 @@ class Stand:
         try:
             raise Failed(f"says {self.message()} at the end")
         except BlockingIOError:
-            pass
+            self.port.settimeout(20)
 
     def rests(self):
         """While nobody presses the receiver is not woken up."""
