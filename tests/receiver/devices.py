@@ -108,9 +108,10 @@ class Device:
         self.write((0, 0), ("EV_SYN", "SYN_DROPPED", 0))
 
     def unplug(self):
-        BED.uevent("/sys" + self.path, "remove")
-        BED.remove_device("/sys" + self.path)
+        # As the kernel does: when it tells, whoever looks does not find it any more.
         os.unlink(BED.get_root_dir() + self.node)
+        os.unlink(f"{BED.get_root_dir()}/sys/class/input/{os.path.basename(self.path)}")
+        BED.uevent("/sys" + self.path, "remove")
         self.down.clear()
 
     def hang_up(self):
