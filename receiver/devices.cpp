@@ -8,7 +8,6 @@
 #include <filesystem>
 #include <optional>
 #include <set>
-#include <sstream>
 #include <string_view>
 #include <utility>
 
@@ -27,17 +26,16 @@ unsigned long hexadecimal(std::string_view digits) {
 
 /// The numbers of the bits that are set in one of the kernel's bit maps: words in hexadecimal, the highest
 /// first.
-std::vector<std::uint16_t> bitsOf(const std::string& map) {
+std::vector<std::uint16_t> bitsOf(std::string_view map) {
   constexpr std::size_t kWord = sizeof(unsigned long) * CHAR_BIT;
-  std::istringstream stream(map);
-  std::vector<std::string> words;
-  for (std::string word; stream >> word;) words.insert(words.begin(), word);
   std::vector<std::uint16_t> bits;
-  for (std::size_t index = 0; index < words.size(); ++index) {
-    const unsigned long word = hexadecimal(words[index]);
+  for (std::size_t first = 0; !map.empty(); first += kWord) {
+    const std::size_t begin = map.rfind(' ') + 1;  // 0 where only one word is left
+    const unsigned long word = hexadecimal(map.substr(begin));
     for (std::size_t bit = 0; bit < kWord; ++bit) {
-      if ((word >> bit & 1) != 0) bits.push_back(static_cast<std::uint16_t>(index * kWord + bit));
+      if ((word >> bit & 1) != 0) bits.push_back(static_cast<std::uint16_t>(first + bit));
     }
+    map = map.substr(0, begin == 0 ? 0 : begin - 1);
   }
   return bits;
 }
