@@ -32,6 +32,19 @@ def add(path, *properties, node="", **attributes):
                                    *(f"A: {name}={value}" for name, value in attributes.items()), "\n"]))
 
 
+def add_cec_adapter(number, addresses):
+    """An HDMI-CEC adapter that has so many addresses on its bus."""
+    def answer(_, client):
+        size = client.get_request() >> 16 & 0x3FFF
+        client.get_arg().resolve(0, size).update(7, bytes([addresses]))  # num_log_addrs of cec_log_addrs
+        client.complete(0, 0)
+        return True
+    ioctls = UMockdev.IoctlBase()
+    ioctls.connect("handle-ioctl", answer)
+    BED.attach_ioctl(f"/dev/cec{number}", ioctls)
+    add(f"/devices/cec{number}", "SUBSYSTEM", "cec", "DEVNAME", f"/dev/cec{number}", node=f"cec{number}")
+
+
 class Device:
     """One that is plugged in. `down` are the keys that are, `grabbed` says whether somebody has grabbed it."""
     parents, count = set(), 0
