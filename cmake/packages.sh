@@ -35,6 +35,9 @@ is_installed() {
     libxcb*-dev) pkg-config --exists xcb xcb-randr xcb-res ;;
     libpulse-dev) pkg-config --exists libpulse ;;
     libglib2.0-dev) pkg-config --exists gio-unix-2.0 ;;
+    libwayland-dev) pkg-config --exists wayland-client ;;
+    libwayland-bin) pkg-config --exists wayland-scanner ;;
+    libxkbcommon-dev) pkg-config --exists xkbcommon ;;
     nlohmann-json3-dev) pkg-config --exists nlohmann_json ;;
     umockdev) command -v umockdev-wrapper >/dev/null ;;
     gir1.2-umockdev-1.0) /usr/bin/python3 -c 'import gi; gi.require_version("UMockdev", "1.0")' 2>/dev/null ;;

@@ -171,7 +171,9 @@ void startFor(const Chapter& chapter, const Row& row, bool shows) {
   fake::startProgram("program", *program.executable != '\0' ? program.executable : "other", words);
   const fake::Program& started = fake::program("program");
   for (const char* title : {"Show", "Document"}) {
-    auto& window = fake::openWindow(title, started.process, started.uniqueName);
+    // Keys are for windows that tell of no actions.
+    auto& window = fake::openWindow(title, started.process,
+                                    row.text.starts_with("key ") ? std::string() : started.uniqueName);
     window.className = program.windowClass;
     window.isFullScreen = shows && window.title == "Show";
   }

@@ -7,6 +7,7 @@
 #include <span>
 #include <string_view>
 #include <tuple>
+#include <utility>
 
 #include "platform/base/run_loop.h"
 #include "platform/linux/players/mpris.h"
@@ -92,15 +93,35 @@ void dropExtensions(std::vector<Instance>& found) {
   });
 }
 
+/// Whether the window is named after what the player plays.
+bool isNamedAfter(const Window& window, const Instance& instance) {
+  Player* const player = playerOf(instance);
+  try {
+    const std::string playing = player != nullptr ? stateOf(*player).title : std::string();
+    return !playing.empty() && window.title.find(playing) != std::string::npos;
+  } catch (const tarnscript::Refusal&) {
+    return false;
+  }
+}
+
 /// Whom a window belongs to although no process says so, by their desktop entry: a player that speaks on the
-/// bus through the proxy of its sandbox, or a program whose windows do not tell their process.
+/// bus through the proxy of its sandbox, or a program whose windows do not tell their process. Of several the
+/// one that the title speaks of, else one that has no window yet.
 Instance* ownerByEntry(std::vector<Instance>& found, const Window& window, const Casting& casting) {
   const auto fits = [&](const Instance& instance) {
     if (instance.entry.empty() || instance.entry != casting.entry || anyBelongsTo(instance)) return false;
     return !instance.owner.empty() || (instance.process == 0 && window.process == 0);
   };
-  const auto owner = std::ranges::find_if(found, fits);
-  return owner != found.end() ? &*owner : nullptr;
+  std::vector<Instance*> owners;
+  for (Instance& instance : found) {
+    if (fits(instance)) owners.push_back(&instance);
+  }
+  if (owners.size() < 2) return owners.empty() ? nullptr : owners.front();
+  const auto looked = windows::look(std::span(&window.id, 1));
+  const Window& now = looked.empty() ? window : looked.front();
+  return *std::ranges::max_element(owners, {}, [&](const Instance* owner) {
+    return std::pair(isNamedAfter(now, *owner), owner->windows.empty());
+  });
 }
 
 /// Makes sure that every program with a window in a role is there.

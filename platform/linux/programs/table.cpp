@@ -104,6 +104,7 @@ constexpr Program kPrograms[] = {
     {.role = Role::Presentation, .name = "Evince", .entry = "org.gnome.Evince", .windowClass = "evince",
      .actions = {{
          {slidewell::kStart, Means::Action, "win.presentation"},
+         {slidewell::kStart, Means::Key, "F5"},
      }}},
     {.role = Role::Presentation, .name = "Papers", .entry = "org.gnome.Papers", .windowClass = "papers",
      .actions = {{
@@ -121,11 +122,17 @@ constexpr Program kPrograms[] = {
     {.role = Role::PhotoLibrary, .name = "Eye of GNOME", .entry = "org.gnome.eog", .windowClass = "eog", .show = ShowStyle::ActionState, .showAction = "win.view-slideshow",
      .actions = {{
          {snapvale::kStartSlideshow, Means::Action, "win.view-slideshow=true"},
+         {snapvale::kStartSlideshow, Means::Key, "F5"},
          {snapvale::kStopSlideshow, Means::Action, "win.view-slideshow=false"},
+         {snapvale::kStopSlideshow, Means::Key, "Escape"},
          {words::kNextAlbum, Means::Action, "win.go-next"},
+         {words::kNextAlbum, Means::Key, "Right"},
          {words::kPreviousAlbum, Means::Action, "win.go-previous"},
+         {words::kPreviousAlbum, Means::Key, "Left"},
          {words::kSpace, Means::Action, "win.pause-slideshow"},
+         {words::kSpace, Means::Key, "p"},
          {words::kCommandEscape, Means::Action, "win.view-fullscreen"},
+         {words::kCommandEscape, Means::Key, "F11"},
      }}},
     {.role = Role::PhotoLibrary, .name = "gThumb", .entry = "org.gnome.gThumb", .windowClass = "gthumb", .show = ShowStyle::OwnWindow,
      .actions = {{

@@ -36,7 +36,7 @@ struct Action {
 enum class ShowStyle : std::uint8_t {
   FullScreen,   ///< its window is full screen, by neither win.fullscreen nor a player's Stopped
   OwnWindow,    ///< a full-screen window stands beside the document's
-  ActionState,  ///< the state of a GTK action tells
+  ActionState,  ///< the state of a GTK action tells, and where it cannot be asked, the full screen
 };
 
 /// A well-known program. Empty texts are what it does not have.

@@ -18,8 +18,10 @@ ShowStyle styleOf(const Performer& performer) {
 }
 
 bool isDocument(const Window& window, const Performer& performer) {
-  return !window.isDialog && (performer.program() == nullptr ||
-                              text::equalIgnoringCase(window.className, performer.program()->windowClass));
+  const programs::Program* const program = performer.program();
+  return !window.isDialog &&
+         (program == nullptr || text::equalIgnoringCase(window.className, program->windowClass) ||
+          text::equalIgnoringCase(window.applicationID, program->entry));
 }
 
 /// Some tell their show as a player's status: stopped is their ordinary window.
@@ -55,11 +57,13 @@ std::vector<const Window*> documentWindows(const Performer& performer) {
 }
 
 bool showRuns(const Performer& performer) {
-  if (styleOf(performer) != ShowStyle::ActionState) {
-    return showWindow(performer) != nullptr && !isStopped(performer);
+  if (styleOf(performer) == ShowStyle::ActionState) {
+    const Window* const front = performer.keyboardWindow();
+    if (front == nullptr) return false;
+    const auto told = players::actionState(*front, performer.program()->showAction);
+    if (told) return *told;
   }
-  const Window* const front = performer.keyboardWindow();
-  return front != nullptr && players::actionState(*front, performer.program()->showAction) == true;
+  return showWindow(performer) != nullptr && !isStopped(performer);
 }
 
 }  // namespace linux::roles

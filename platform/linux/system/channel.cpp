@@ -2,14 +2,13 @@
 
 #include <poll.h>
 #include <sys/socket.h>
-#include <sys/un.h>
 
-#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <map>
 
 #include "platform/linux/system/listening_sockets.h"
+#include "platform/linux/system/local_socket.h"
 #include "platform/linux/system/process.h"
 
 namespace linux::system {
@@ -24,19 +23,9 @@ constexpr std::size_t kMostPaths = 16;
 std::map<pid_t, std::string> sPaths;
 
 /// A connection to that path, if it is this process that takes it; none otherwise.
-base::FileDescriptor connectTo(const std::string& path, pid_t process) {
-  sockaddr_un address{};
-  address.sun_family = AF_UNIX;
-  if (path.empty() || path.size() >= sizeof address.sun_path) return base::FileDescriptor();
-  std::ranges::copy(path, address.sun_path);
-  base::FileDescriptor connection(socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0));
-  ucred peer{};
-  socklen_t size = sizeof peer;
-  if (!connection ||
-      connect(connection.get(), reinterpret_cast<const sockaddr*>(&address), sizeof address) != 0 ||
-      getsockopt(connection.get(), SOL_SOCKET, SO_PEERCRED, &peer, &size) != 0 || peer.pid != process) {
-    return base::FileDescriptor();
-  }
+base::FileDescriptor connectToProcess(const std::string& path, pid_t process) {
+  base::FileDescriptor connection = connectTo(path);
+  if (!connection || listenerOf(connection.get()) != process) return base::FileDescriptor();
   return connection;
 }
 
@@ -55,10 +44,10 @@ std::string channelPath(const Listener& listener) {
 
 Channel::Channel(const Listener& listener, Limit limit) : limit_(patience(limit)), deadline_(limit_) {
   if (timedOutThisTurn(listener.process)) return;
-  socket_ = connectTo(channelPath(listener), listener.process);
+  socket_ = connectToProcess(channelPath(listener), listener.process);
   if (socket_) return;
   // Another process may have had the number, or this one another socket.
-  if (sPaths.erase(listener.process) > 0) socket_ = connectTo(channelPath(listener), listener.process);
+  if (sPaths.erase(listener.process) > 0) socket_ = connectToProcess(channelPath(listener), listener.process);
 }
 
 bool Channel::waitFor(short events) {

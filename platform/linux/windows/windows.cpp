@@ -70,13 +70,24 @@ const Backend* frontAuthority() {
   return found != sBackends.end() ? *found : nullptr;
 }
 
+/// The windows of a back end with the titles that they have now, where others may know them too.
+std::vector<Window> titled(const Backend& backend) {
+  std::vector<Window> windows = backend.list();
+  const auto knows = [](const Backend* each) { return !each->list().empty(); };
+  if (std::ranges::count_if(sBackends, knows) < 2) return windows;
+  std::vector<Window> looked = windows;
+  backend.look(looked);
+  for (std::size_t i = 0; i < windows.size(); ++i) windows[i].title = std::move(looked[i].title);
+  return windows;
+}
+
 void merge() {
   sWindows.clear();
   sIDs.clear();
   const Backend* const authority = frontAuthority();
   for (const Backend* backend : sBackends) {
     const std::size_t known = sWindows.size();
-    for (Window window : backend->list()) {
+    for (Window window : titled(*backend)) {
       window.isActive = window.isActive && backend == authority;
       const auto same = findSame(window, known);
       if (!same) {
@@ -107,13 +118,14 @@ Window lookBy(ID id, const Window& window) {
   return looked;
 }
 
-/// The id by which a key reaches the window; none when no back end reaches it.
-ID reachable(const Window& window, const std::vector<ID>& ids) {
+/// The id by which a key reaches the window; none when no back end reaches it. The release goes where the
+/// press went, wherever the focus is by then.
+ID reachable(const Window& window, const std::vector<ID>& ids, bool down) {
   for (const ID& id : ids) {
     if (id.backend->reach() == Reach::AnyWindow) return id;
   }
   for (const ID& id : ids) {
-    if (id.backend->reach() == Reach::FocusedWindow && window.isActive) return id;
+    if (id.backend->reach() == Reach::FocusedWindow && (window.isActive || !down)) return id;
   }
   return {};
 }
@@ -180,7 +192,7 @@ bool sendKey(ID window, std::uint32_t keysym, bool down, Modifiers modifiers) {
   if (!window) return false;
   // A window that has gone is still owed the release of its key.
   const auto index = indexOf(window);
-  const ID reached = index ? reachable(sWindows[*index], sIDs[*index]) : window;
+  const ID reached = index ? reachable(sWindows[*index], sIDs[*index], down) : window;
   return reached && reached.backend->sendKey(reached.number, keysym, down, modifiers);
 }
 

@@ -20,7 +20,7 @@
 #include "platform/base/run_loop.h"
 #include "platform/host.h"
 #include "platform/linux/system/turn.h"
-#include "platform/linux/windows/x11/display.h"
+#include "platform/linux/windows/session.h"
 
 namespace linux::windows::x11 {
 namespace {
@@ -174,7 +174,7 @@ xcb_connection_t* connection() {
   if (sConnection != nullptr) takeInEvents();
   if (sConnection == nullptr && sTried != base::turn()) {
     sTried = base::turn();
-    if (!connectToDisplay() && takeDisplayOfSession()) connectToDisplay();
+    if (!connectToDisplay() && takeSessionEnvironment()) connectToDisplay();
   }
   return sConnection;
 }

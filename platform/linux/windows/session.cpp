@@ -1,15 +1,23 @@
-#include "platform/linux/windows/x11/display.h"
+#include "platform/linux/windows/session.h"
 
+#include <cstdint>
 #include <cstdlib>
+#include <optional>
 #include <string>
 #include <string_view>
 
+#include "platform/base/run_loop.h"
 #include "platform/linux/system/bus.h"
 
-namespace linux::windows::x11 {
+namespace linux::windows {
+
 namespace {
 
-constexpr std::string_view kVariables[] = {"DISPLAY", "XAUTHORITY"};
+constexpr std::string_view kVariables[] = {"DISPLAY", "XAUTHORITY", "WAYLAND_DISPLAY", "SWAYSOCK"};
+
+/// The turn in which the service manager was last asked, and whether it told anything new.
+std::optional<std::uint64_t> sAsked;
+bool sChanged = false;
 
 /// True when the assignment is one of interest and says something new.
 bool take(std::string_view assignment) {
@@ -25,9 +33,7 @@ bool take(std::string_view assignment) {
   return false;
 }
 
-}  // namespace
-
-bool takeDisplayOfSession() {
+bool askServiceManager() {
   const system::Message answer =
       system::call({"org.freedesktop.systemd1", 0},
                    {"/org/freedesktop/systemd1", "org.freedesktop.DBus.Properties", "Get"},
@@ -42,4 +48,12 @@ bool takeDisplayOfSession() {
   return changed;
 }
 
-}  // namespace linux::windows::x11
+}  // namespace
+
+bool takeSessionEnvironment() {
+  if (sAsked == base::turn()) return sChanged;
+  sAsked = base::turn();
+  return sChanged = askServiceManager();
+}
+
+}  // namespace linux::windows

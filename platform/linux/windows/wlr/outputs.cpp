@@ -1,0 +1,85 @@
+#include "platform/linux/windows/wlr/outputs.h"
+
+#include <wayland-client.h>
+
+#include <algorithm>
+#include <memory>
+
+#include "platform/linux/windows/wlr/toplevels.h"
+
+namespace linux::windows::wlr {
+
+namespace {
+
+struct Known {
+  wl_output* proxy = nullptr;
+  Output output;
+};
+
+std::vector<std::unique_ptr<Known>> sOutputs;
+
+void setMode(void* data, wl_output*, std::uint32_t flags, std::int32_t width, std::int32_t height,
+             std::int32_t) {
+  if ((flags & WL_OUTPUT_MODE_CURRENT) == 0) return;
+  static_cast<Known*>(data)->output.area = {0, 0, width, height};
+  int left = 0;
+  for (const auto& known : sOutputs) {
+    known->output.area.x = left;
+    left += known->output.area.width;
+  }
+}
+
+constexpr wl_output_listener kListener{
+    .geometry = [](void*, auto*, int, int, int, int, int, const char*, const char*, int) {},
+    .mode = setMode,
+    .done = [](void*, auto*) {},
+    .scale = [](void*, auto*, int) {},
+    .name = [](void*, auto*, const char*) {},
+    .description = [](void*, auto*, const char*) {},
+};
+
+void destroy(const Known& known) {
+  leaveOutput(known.proxy);
+  wl_output_destroy(known.proxy);
+}
+
+}  // namespace
+
+void addOutput(std::uint32_t name, wl_output* output) {
+  const auto& known = sOutputs.emplace_back(new Known{output, {name, {}}});
+  wl_output_add_listener(output, &kListener, known.get());
+}
+
+void removeOutput(std::uint32_t name) {
+  const auto gone = std::ranges::find(sOutputs, name, [](const auto& known) { return known->output.id; });
+  if (gone == sOutputs.end()) return;
+  destroy(**gone);
+  sOutputs.erase(gone);
+}
+
+void forgetOutputs() {
+  for (const auto& known : sOutputs) destroy(*known);
+  sOutputs.clear();
+}
+
+std::vector<Output> outputs() {
+  std::vector<Output> sized;
+  for (const auto& known : sOutputs) {
+    if (known->output.area.width > 0) sized.push_back(known->output);
+  }
+  return sized;
+}
+
+Area areaOf(std::span<wl_output* const> entered) {
+  Area area;
+  for (const auto& known : sOutputs) {
+    if (std::ranges::find(entered, known->proxy) == entered.end()) continue;
+    const Area& covered = known->output.area;
+    if (area.width == 0) area.x = covered.x;
+    area.width = covered.x + covered.width - area.x;
+    area.height = std::max(area.height, covered.height);
+  }
+  return area;
+}
+
+}  // namespace linux::windows::wlr

@@ -1,0 +1,27 @@
+// The compositor's outputs.
+#pragma once
+
+#include <cstdint>
+#include <span>
+#include <vector>
+
+#include "platform/linux/windows/window.h"
+
+struct wl_output;
+
+namespace linux::windows::wlr {
+
+/// Takes over an output, which the compositor calls by this number.
+void addOutput(std::uint32_t name, wl_output* output);
+/// Nothing happens when the number is no output's.
+void removeOutput(std::uint32_t name);
+void forgetOutputs();
+
+/// Those whose size is known, side by side in the order in which they came: compositors tell no position that
+/// could be relied on, and all that counts is which of them a window covers.
+std::vector<Output> outputs();
+
+/// What these outputs take up of that row; nothing when there are none.
+Area areaOf(std::span<wl_output* const> entered);
+
+}  // namespace linux::windows::wlr

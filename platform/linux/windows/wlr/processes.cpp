@@ -1,0 +1,43 @@
+#include "platform/linux/windows/wlr/processes.h"
+
+#include <algorithm>
+
+#include "platform/linux/windows/wlr/sway.h"
+
+namespace linux::windows::wlr {
+
+void findProcesses(pid_t compositor, const std::vector<Toplevel*>& windows) {
+  std::vector<Toplevel*> unknown;
+  std::ranges::copy_if(windows, std::back_inserter(unknown),
+                       [](const Toplevel* window) { return window->container == 0; });
+  if (unknown.empty()) return;
+  std::vector<Container> containers = readContainers(compositor);
+  const auto isTaken = [&](const Container& container) {
+    return std::ranges::find(windows, container.id, &Toplevel::container) != windows.end();
+  };
+  std::erase_if(containers, isTaken);
+  // Both sides in the order in which the windows were opened, so that those which nothing else tells apart
+  // meet as they should. A title may have changed between the two tellings.
+  std::ranges::sort(unknown, {}, &Toplevel::age);
+  for (const bool byTitle : {true, false}) {
+    for (Toplevel* const window : unknown) {
+      if (window->container != 0) continue;
+      const auto same = std::ranges::find_if(containers, [&](const Container& container) {
+        return container.applicationID == window->description.applicationID &&
+               (!byTitle || container.title == window->description.title);
+      });
+      if (same == containers.end()) continue;
+      window->container = same->id;
+      window->process = same->process;
+      containers.erase(same);
+    }
+  }
+}
+
+bool isOnShownWorkspace(pid_t compositor, const Toplevel& window) {
+  const auto containers = readContainers(compositor);
+  const auto found = std::ranges::find(containers, window.container, &Container::id);
+  return found == containers.end() || found->isVisible;
+}
+
+}  // namespace linux::windows::wlr

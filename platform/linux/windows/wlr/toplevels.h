@@ -1,0 +1,67 @@
+// The windows of which the compositor tells, by events alone.
+#pragma once
+
+#include <sys/types.h>
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+struct wl_output;
+struct wl_seat;
+struct zwlr_foreign_toplevel_handle_v1;
+struct zwlr_foreign_toplevel_manager_v1;
+
+namespace linux::windows::wlr {
+
+/// What is told of a window; changes of it come together.
+struct Description {
+  std::string applicationID;
+  std::string title;
+  bool isActive = false;
+  bool isFullScreen = false;
+  bool isMinimized = false;
+  bool isDialog = false;
+  /// Those that show a part of it.
+  std::vector<wl_output*> outputs;
+};
+
+struct Toplevel {
+  /// Never used again, and never 0.
+  std::uint64_t number = 0;
+  /// The later a window was opened, the greater.
+  std::int64_t age = 0;
+  zwlr_foreign_toplevel_handle_v1* handle = nullptr;
+  Description description;
+  /// What has been told since the last of its changes was complete.
+  Description next;
+  /// It has been described at all.
+  bool isComplete = false;
+
+  // What the compositor's own language tells (processes.h).
+  pid_t process = 0;
+  std::int64_t container = 0;
+};
+
+/// Begins to listen to the manager, which it owns from here on.
+void followToplevels(zwlr_foreign_toplevel_manager_v1* manager);
+/// From here on those that come are new: the first to be told of are those that were there, the last that was
+/// opened first.
+void noteAllAreKnown();
+/// Ends that, and forgets all of them.
+void forgetToplevels();
+/// Whether a compositor is followed that tells of windows.
+bool followsToplevels();
+
+/// All of them, those described too; the last that was active or opened first.
+std::vector<Toplevel*> toplevels();
+/// Null when it has gone.
+Toplevel* findToplevel(std::uint64_t number);
+
+/// Counts changes: windows that came or went, another active one, another application id.
+unsigned toplevelChanges();
+
+/// An output has gone.
+void leaveOutput(wl_output* output);
+
+}  // namespace linux::windows::wlr
