@@ -43,7 +43,7 @@ is_installed() {
     gir1.2-umockdev-1.0) /usr/bin/python3 -c 'import gi; gi.require_version("UMockdev", "1.0")' 2>/dev/null ;;
     python3-gi | python3-dbusmock) /usr/bin/python3 -c "import ${package#python3-}" 2>/dev/null ;;
     *)
-      program=$(sed -n "s/^$package //p" tests/desktop/packages)
+      program=$(awk -v package="$package" '$1 == package { print $2 }' tests/desktop/packages)
       command -v "${program:-$package}" >/dev/null || [[ -e "${program:-$package}" ]]
       ;;
   esac

@@ -76,7 +76,16 @@ def die_with_parent():
     prctl(PR_SET_PDEATHSIG, signal.SIGKILL)
 
 
+def nearest(seen):
+    """The number of the media's colour that a pixel has; nothing for any other."""
+    near = [number for number, colour in COLOURS.items()
+            if all(abs(a - b) < 40 for a, b in zip(colour, seen))]
+    return near[0] if near else None
+
+
 class Desktop:
+    video = "x11"
+
     def __init__(self):
         self.home = tempfile.mkdtemp(prefix="kvd-desktop-")
         self.runtime, self.media = (os.path.join(self.home, name) for name in ("run", "media"))
@@ -151,6 +160,11 @@ class Desktop:
             return ""
 
     def set_up(self):
+        self.start_windows()
+        self.start_bus()
+        self.start_sound()
+
+    def start_windows(self):
         reading, writing = os.pipe()
         self.x = self.start("Xvfb", "-displayfd", str(writing), "-screen", "0", "1280x720x24",
                             "-nolisten", "tcp", "-noreset", "-fbdir", self.home, pass_fds=[writing])
@@ -158,8 +172,6 @@ class Desktop:
         with os.fdopen(reading) as display:
             self.env["DISPLAY"] = ":" + display.readline().strip()
         self.start("openbox", "--sm-disable")
-        self.start_bus()
-        self.start_sound()
         wait(lambda: "window id" in self.property("-root", "_NET_SUPPORTING_WM_CHECK"), "a window manager")
 
     def start_bus(self):
@@ -234,10 +246,7 @@ class Desktop:
         with open(os.path.join(self.home, "Xvfb_screen0"), "rb") as screen:
             header = struct.unpack(">20I", screen.read(80))  # an X window dump: size, line length, colour map
             screen.seek(header[0] + header[19] * 12 + y * header[12] + x * 4)
-            seen = screen.read(3)[::-1]
-        near = [number for number, colour in COLOURS.items()
-                if all(abs(a - b) < 40 for a, b in zip(colour, seen))]
-        return near[0] if near else None
+            return nearest(screen.read(3)[::-1])
 
     def corner(self):
         return self.colour(5, 5)
@@ -255,3 +264,55 @@ class Desktop:
 
     def muted(self):
         return self.read("pactl", "get-sink-mute", "@DEFAULT_SINK@") == "Mute: yes"
+
+
+class Wayland(Desktop):
+    """Without any X server."""
+    video = "wlshm"
+
+    def __init__(self, compositor):
+        super().__init__()
+        self.compositor = compositor
+        self.env.update(WLR_BACKENDS="headless", WLR_LIBINPUT_NO_DEVICES="1", WLR_RENDERER="pixman")
+        self.write(".config/sway/config", "xwayland disable\n")
+
+    def start_windows(self):
+        self.server = self.start(self.compositor)
+        self.env["WAYLAND_DISPLAY"] = wait(lambda: glob.glob(f"{self.runtime}/wayland-[0-9]"), "a compositor")[0]
+        # A person has a keyboard; without one, programs learn of kvd's own too late for its first key.
+        self.start("wtype", "-s", "3600000")
+
+    def sway(self, *words):
+        sockets = glob.glob(f"{self.runtime}/sway-ipc.*.{self.server.pid}.sock")
+        return json.loads(self.read("swaymsg", "-s", "".join(sockets), "-r", *words) or "null")
+
+    def windows(self, *state):
+        """Application id and title of those with a state, in wlrctl's words."""
+        if self.compositor != "sway":
+            told = self.read("wlrctl", "toplevel", "list", *state)
+            return [line.split(": ", 1) for line in told.splitlines()]
+
+        def below(node):
+            has = {"state:active": node["focused"], "state:fullscreen": node.get("fullscreen_mode") == 1}
+            own = [[node["app_id"], node["name"]]] if "pid" in node and all(map(has.get, state)) else []
+            return sum(map(below, node["nodes"]), own)
+        return below(self.sway("-t", "get_tree") or {"focused": False, "nodes": []})
+
+    def bring_to_front(self, title):
+        if self.compositor == "sway":
+            self.sway(f'[title="{title}"] focus')
+        else:
+            self.read("wlrctl", "toplevel", "focus", f"title:{title}")
+        wait(lambda: [name for _, name in self.windows("state:active")] == [title], f"{title} is in front")
+
+    def front(self):
+        """Without the domain that GTK programs have in their names."""
+        return "".join(name for name, _ in self.windows("state:active")).rpartition(".")[2].lower()
+
+    def full_screen(self):
+        return [title for _, title in self.windows("state:fullscreen")]
+
+    def colour(self, x=500, y=250):
+        shot = subprocess.run(("grim", "-t", "ppm", "-g", f"{x},{y} 1x1", "-"), env=self.env, timeout=20,
+                              capture_output=True, check=False).stdout
+        return nearest(shot[-3:])

@@ -51,7 +51,8 @@ class Player(Program):
 
     def ask(self, verb, *words):
         """What busctl says; nothing when the player does not answer."""
-        told = self.desktop.read("busctl", "--user", "--json=short", "--timeout=2", verb, self.bus_name,
+        name = self.bus_name.format(pid=self.process.pid)
+        told = self.desktop.read("busctl", "--user", "--json=short", "--timeout=2", verb, name,
                                  "/org/mpris/MediaPlayer2", "org.mpris.MediaPlayer2.Player", *words)
         return json.loads(told)["data"] if told else None
 
@@ -100,9 +101,10 @@ class Strawberry(Player):
 
 
 class Mpv(Player):
-    def __init__(self, desktop, *options):
-        self.channel = f"{desktop.runtime}/mpv"
-        super().__init__(desktop, "mpv", "mpv", "mpv", "--vo=x11", f"--input-ipc-server={self.channel}",
+    def __init__(self, desktop, *options, bus_name="mpv"):
+        self.channel = f"{desktop.runtime}/{bus_name}"
+        super().__init__(desktop, "mpv", bus_name, "mpv", f"--vo={desktop.video}",
+                         f"--input-ipc-server={self.channel}",
                          *options, f"{desktop.media}/film.mkv")
         wait(lambda: self.get("PlaybackStatus") != "Stopped", "mpv has loaded the film")
 

@@ -56,3 +56,16 @@ rhythmbox: drops=org.mpris.MediaPlayer2.rhythmbox.instance7
 tell Lyrabox to play
   fails
 wait 1s
+
+# Windows of which nobody knows the process are those of the player whose title they have.
+player mpv title=Dune
+player mpv.instance7 title=Jaws
+window Jaws of nobody id=mpv
+window Dune of nobody id=mpv
+front Jaws
+tap play
+  mpv.instance7: Play
+front Dune
+tap play
+  mpv.instance7: Pause
+  mpv: Play

@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 #include "platform/linux/windows/none.h"
 
 namespace {
@@ -22,7 +24,15 @@ template <int which>
 Backend backend() {
   Backend made = kNone;
   made.takeIn = [] { return true; };
-  made.list = []() -> const std::vector<Window>& { return sSystems[which].windows; };
+  made.list = []() -> const std::vector<Window>& {
+    static std::vector<Window> untitled;
+    untitled = sSystems[which].windows;
+    for (Window& each : untitled) each.title.clear();
+    return untitled;
+  };
+  made.look = [](std::span<Window> windows) {
+    for (Window& each : windows) each = *std::ranges::find(sSystems[which].windows, each.id, &Window::id);
+  };
   made.knowsFront = [] { return sSystems[which].knowsFront; };
   made.reach = [] { return sSystems[which].reach; };
   made.outputs = [] { return std::vector<Output>{{1, {0, 0, 100 * (which + 1), 100}}}; };
@@ -65,6 +75,10 @@ TEST(Windows, OfTwoBackendsAreMerged) {
   EXPECT_FALSE(sendKey({&kCompositor, 1}, 'a', true, kNoModifier));
   sSystems[0].reach = Reach::FocusedWindow;
   EXPECT_TRUE(sendKey({&kCompositor, 1}, 'a', true, kNoModifier)) << "it is the one in front";
+  sSystems[0].windows[0].isActive = false;
+  takeIn();
+  EXPECT_FALSE(sendKey({&kCompositor, 1}, 'a', true, kNoModifier));
+  EXPECT_TRUE(sendKey({&kCompositor, 1}, 'a', false, kNoModifier)) << "the release is owed all the same";
   ASSERT_EQ(outputs().size(), 2U);
   EXPECT_FALSE(isCaptured(outputs()[0].id)) << "its own window does not cover it";
   EXPECT_TRUE(isCaptured(outputs()[1].id));

@@ -50,7 +50,7 @@ Proxy* bind(std::uint32_t name, const wl_interface& interface, std::uint32_t ver
 void addGlobal(void*, wl_registry*, std::uint32_t name, const char* interface, std::uint32_t version) {
   const auto is = [&](const wl_interface& known) { return std::string_view(interface) == known.name; };
   if (is(wl_output_interface)) {
-    addOutput(name, bind<wl_output>(name, wl_output_interface, 1));
+    addOutput(name, bind<wl_output>(name, wl_output_interface, std::min(version, 4U)));
   } else if (is(wl_seat_interface) && sSeat == nullptr) {
     sSeat = bind<wl_seat>(name, wl_seat_interface, 1);
   } else if (is(zwlr_foreign_toplevel_manager_v1_interface) && !followsToplevels()) {

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <memory>
+#include <string>
 
 #include "platform/linux/windows/wlr/toplevels.h"
 
@@ -14,6 +15,7 @@ namespace {
 struct Known {
   wl_output* proxy = nullptr;
   Output output;
+  std::string name;
 };
 
 std::vector<std::unique_ptr<Known>> sOutputs;
@@ -34,19 +36,23 @@ constexpr wl_output_listener kListener{
     .mode = setMode,
     .done = [](void*, auto*) {},
     .scale = [](void*, auto*, int) {},
-    .name = [](void*, auto*, const char*) {},
+    .name = [](void* data, auto*, const char* name) { static_cast<Known*>(data)->name = name; },
     .description = [](void*, auto*, const char*) {},
 };
 
 void destroy(const Known& known) {
   leaveOutput(known.proxy);
-  wl_output_destroy(known.proxy);
+  if (wl_output_get_version(known.proxy) >= WL_OUTPUT_RELEASE_SINCE_VERSION) {
+    wl_output_release(known.proxy);
+  } else {
+    wl_output_destroy(known.proxy);
+  }
 }
 
 }  // namespace
 
 void addOutput(std::uint32_t name, wl_output* output) {
-  const auto& known = sOutputs.emplace_back(new Known{output, {name, {}}});
+  const auto& known = sOutputs.emplace_back(new Known{output, {name, {}}, {}});
   wl_output_add_listener(output, &kListener, known.get());
 }
 
@@ -80,6 +86,11 @@ Area areaOf(std::span<wl_output* const> entered) {
     area.height = std::max(area.height, covered.height);
   }
   return area;
+}
+
+Area areaOf(std::string_view name) {
+  const auto named = std::ranges::find(sOutputs, name, [](const auto& known) { return known->name; });
+  return named != sOutputs.end() ? (*named)->output.area : Area{};
 }
 
 }  // namespace linux::windows::wlr

@@ -3,6 +3,7 @@
 
 #include <cstdint>
 #include <span>
+#include <string_view>
 #include <vector>
 
 #include "platform/linux/windows/window.h"
@@ -23,5 +24,7 @@ std::vector<Output> outputs();
 
 /// What these outputs take up of that row; nothing when there are none.
 Area areaOf(std::span<wl_output* const> entered);
+/// The same for the output with this name, as "HDMI-A-1".
+Area areaOf(std::string_view name);
 
 }  // namespace linux::windows::wlr

@@ -1,8 +1,7 @@
 #include "platform/linux/windows/wlr/processes.h"
 
 #include <algorithm>
-
-#include "platform/linux/windows/wlr/sway.h"
+#include <iterator>
 
 namespace linux::windows::wlr {
 
@@ -34,10 +33,11 @@ void findProcesses(pid_t compositor, const std::vector<Toplevel*>& windows) {
   }
 }
 
-bool isOnShownWorkspace(pid_t compositor, const Toplevel& window) {
+std::optional<Container> lookAt(pid_t compositor, const Toplevel& window) {
   const auto containers = readContainers(compositor);
   const auto found = std::ranges::find(containers, window.container, &Container::id);
-  return found == containers.end() || found->isVisible;
+  if (found == containers.end()) return std::nullopt;
+  return *found;
 }
 
 }  // namespace linux::windows::wlr

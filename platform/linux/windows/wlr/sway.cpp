@@ -10,6 +10,7 @@
 #include <cstdlib>
 #include <cstring>
 #include <nlohmann/json.hpp>
+#include <utility>
 
 #include "platform/base/deadline.h"
 #include "platform/base/file_descriptor.h"
@@ -84,10 +85,10 @@ T valueIn(const Json& node, const char* member) {
   return value != nullptr ? *value : T();
 }
 
-Container containerOf(const Json& node) {
-  Container made{valueIn<std::int64_t>(node, "id"), static_cast<pid_t>(valueIn<std::int64_t>(node, "pid")),
+Container containerOf(const Json& node, const std::string& output) {
+  Container made{valueIn<std::int64_t>(node, "id"),    static_cast<pid_t>(valueIn<std::int64_t>(node, "pid")),
                  valueIn<std::string>(node, "app_id"), valueIn<std::string>(node, "name"),
-                 valueIn<bool>(node, "visible")};
+                 valueIn<bool>(node, "visible"),       output};
   const auto properties = node.find("window_properties");
   if (properties != node.end() && made.applicationID.empty()) {
     made.applicationID = valueIn<std::string>(*properties, "class");
@@ -114,17 +115,23 @@ std::vector<Container> readContainers(pid_t compositor) {
 std::vector<Container> containersIn(std::string_view tree) {
   std::vector<Container> found;
   const Json root = Json::parse(tree, nullptr, false);
-  std::vector<const Json*> pending{&root};
+  struct Pending {
+    const Json* node;
+    std::string output;
+  };
+  std::vector<Pending> pending{{&root, {}}};
   while (!pending.empty()) {
-    const Json& node = *pending.back();
+    const auto [node, above] = std::move(pending.back());
     pending.pop_back();
-    if (!node.is_object()) continue;
+    if (!node->is_object()) continue;
+    const std::string output =
+        valueIn<std::string>(*node, "type") == "output" ? valueIn<std::string>(*node, "name") : above;
     // Of all that is in the tree only windows have a process.
-    if (node.contains("pid")) found.push_back(containerOf(node));
+    if (node->contains("pid")) found.push_back(containerOf(*node, output));
     for (const char* const children : {"nodes", "floating_nodes"}) {
-      const auto list = node.find(children);
-      if (list == node.end() || !list->is_array()) continue;
-      for (const Json& child : *list) pending.push_back(&child);
+      const auto list = node->find(children);
+      if (list == node->end() || !list->is_array()) continue;
+      for (const Json& child : *list) pending.push_back({&child, output});
     }
   }
   std::ranges::sort(found, {}, &Container::id);

@@ -19,6 +19,8 @@ struct Container {
   std::string title;
   /// On a workspace that is shown.
   bool isVisible = false;
+  /// The name of the output that shows it.
+  std::string output;
 };
 
 /// Asks the compositor with this process for its windows. None where it does not speak the protocol or does

@@ -55,8 +55,11 @@ void look(std::span<Window> windows) {
     const bool isActive = window.isActive;
     window = windowOf(*toplevel);
     window.isActive = isActive;
-    // Only shows must be told from those on other workspaces; most windows are none.
-    if (window.isFullScreen) window.isShown = isOnShownWorkspace(compositor(), *toplevel);
+    // Sway tells of full screen on workspaces that are not shown too, and since 1.10 of no outputs.
+    const auto container = window.isFullScreen ? lookAt(compositor(), *toplevel) : std::nullopt;
+    if (!container) continue;
+    window.isShown = container->isVisible;
+    if (const Area area = areaOf(container->output); area.width > 0) window.area = area;
   }
 }
 
