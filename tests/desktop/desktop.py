@@ -45,9 +45,9 @@ def lasts(condition, seconds=0.7):
     return True
 
 
-def stays(condition, what):
+def stays(condition, what, seconds=0.7):
     """Asks for a while; every answer must be true."""
-    if not lasts(condition):
+    if not lasts(condition, seconds):
         raise Failed(f"no longer so: {what}")
 
 

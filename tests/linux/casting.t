@@ -60,8 +60,8 @@ wait 1s
 # Windows of which nobody knows the process are those of the player whose title they have.
 player mpv title=Dune
 player mpv.instance7 title=Jaws
-window Jaws of nobody id=mpv
 window Dune of nobody id=mpv
+window Jaws of nobody id=mpv
 front Jaws
 tap play
   mpv.instance7: Play
