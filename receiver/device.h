@@ -45,8 +45,6 @@ class Device {
   /// a press must see its release. False where somebody else has it grabbed.
   bool setGrabbed(bool grabbed);
 
-  bool grabbed() const { return grabbed_; }
-
  private:
   struct Closer {
     void operator()(libevdev* device) const { libevdev_free(device); }

@@ -2,8 +2,8 @@
 
 #include <chrono>
 #include <cstdio>
-#include <exception>
 #include <string>
+#include <system_error>
 
 #include "receiver/cec.h"
 #include "receiver/device.h"

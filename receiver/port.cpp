@@ -6,7 +6,6 @@
 
 #include "messages/kvd_messages.h"
 #include "platform/base/service_directory.h"
-#include "receiver/clock.h"
 #include "remote/kvd_client.h"
 
 namespace receiver {

@@ -1,13 +1,15 @@
 // The daemon's service port, kept open.
 #pragma once
 
+#include <cstdint>
 #include <deque>
 #include <functional>
 #include <optional>
 
 #include "platform/mach.h"
+#include "receiver/clock.h"
 #include "receiver/handles.h"
-#include "receiver/holds.h"
+#include "remote/buttons.h"
 
 namespace receiver {
 

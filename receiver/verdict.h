@@ -1,7 +1,9 @@
 // Which input devices are remotes, and why.
 #pragma once
 
+#include <cstdint>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "receiver/keymap.h"
