@@ -8,6 +8,7 @@
 #include "receiver/cec.h"
 #include "receiver/device.h"
 #include "receiver/devices.h"
+#include "receiver/front.h"
 #include "receiver/holders.h"
 #include "receiver/names.h"
 #include "receiver/pass_through.h"
@@ -85,12 +86,17 @@ int list(const Arguments& arguments) {
   PassThrough passThrough(arguments.passThrough);
   const bool helper = passThrough.open() && passThrough.serves(kPatience);
   bool any = false;
+  bool anyRemote = false;
   for (const Node& node : findDevices(arguments.devices)) {
     if (node.verdict == Verdict::NoButtons) continue;
     print(node, arguments, helper);
     any = true;
+    anyRemote |= isRemote(node.verdict);
   }
   if (!any) std::puts("No input device has a button that kvd knows.");
+  if (const std::string taker = anyRemote ? takerNow() : ""; !taker.empty()) {
+    std::printf("%s is in front and has the remotes; kvd has them when another window is.\n", taker.c_str());
+  }
   for (const std::string& line : adaptersWithoutKeys()) std::puts(line.c_str());
   if (arguments.grab && !helper) {
     std::printf(

@@ -47,6 +47,11 @@ void Monitor::session(bool active) const {
     show(active ? "the session is the active one" : "the session is not the active one: no remote is read");
 }
 
+void Monitor::taken(const std::string& program) const {
+  if (!on_) return;
+  show(program.empty() ? "kvd has the remotes again" : program + " is in front and has the remotes");
+}
+
 void Monitor::locked(bool locked) const {
   if (on_) show(locked ? "the screen is locked" : "the screen is unlocked");
 }

@@ -1,6 +1,7 @@
 // What --monitor shows.
 #pragma once
 
+#include <string>
 #include <string_view>
 
 #include "receiver/device.h"
@@ -26,6 +27,8 @@ class Monitor {
   void sent(const remote::Button& button, std::int32_t value, bool listened) const;
 
   void session(bool active) const;
+  /// The program in front takes the remote itself; none does when the name is empty.
+  void taken(const std::string& program) const;
   void locked(bool locked) const;
 
  private:

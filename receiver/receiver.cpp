@@ -13,6 +13,7 @@
 #include "receiver/clock.h"
 #include "receiver/device.h"
 #include "receiver/devices.h"
+#include "receiver/front.h"
 #include "receiver/handles.h"
 #include "receiver/holds.h"
 #include "receiver/lock.h"
@@ -57,6 +58,7 @@ class Receiver {
   void setGrab(Remote& remote);
   void setGrabs();
   void onListener();
+  void onTaker();
 
   void take(const Remote& remote, const Change& change);
   void say(const remote::Button& button, std::int32_t value);
@@ -78,6 +80,7 @@ class Receiver {
   Source bounce_;
   Source grace_;
   Slot notifications_;
+  Front front_;
   Lock lock_;
   DeviceMonitor devices_;
   std::optional<Session> session_;
@@ -92,6 +95,7 @@ Receiver::Receiver(const Arguments& arguments)
       passThrough_(arguments.passThrough),
       holds_([this](const remote::Button& button, std::int32_t value) { say(button, value); }),
       listened_(port_.isOpen()),
+      front_(loop_.get(), [this] { onTaker(); }),
       lock_(sessionBus_.get(), [this](bool locked) { setLocked(locked); }),
       devices_(loop_.get(), [this] { refresh(); }) {
   endOnSignals();
@@ -179,6 +183,7 @@ void Receiver::refresh() {
   }
   for (const int number : leaving) close(number);
   for (const Node& node : nodes) open(node);
+  front_.follow(!remotes_.empty());
 }
 
 void Receiver::open(const Node& node) {
@@ -214,7 +219,7 @@ void Receiver::close(int number) {
 }
 
 void Receiver::setGrab(Remote& remote) {
-  if (remote.device->setGrabbed(arguments_.grab && listened_)) return;
+  if (remote.device->setGrabbed(arguments_.grab && listened_ && front_.taker().empty())) return;
   monitor_.refused(remote.node, "somebody else has grabbed it");
 }
 
@@ -228,7 +233,13 @@ void Receiver::onListener() {
   setGrabs();
 }
 
+void Receiver::onTaker() {
+  monitor_.taken(front_.taker());
+  setGrabs();
+}
+
 void Receiver::take(const Remote& remote, const Change& change) {
+  if (change.down) front_.refresh();
   const Key key{remote.number, change.key};
   const Node& node = remote.node;
   const remote::Button* const button = buttonOf(change.key, change.scan, {node.road, node.volumeKeys});
@@ -238,6 +249,8 @@ void Receiver::take(const Remote& remote, const Change& change) {
     holds_.release(key, change.time);
   } else if (change.stale) {
     monitor_.changed(node, change, button, "dropped, it comes too late");
+  } else if (!front_.taker().empty()) {
+    monitor_.changed(node, change, button, change.grabbed ? "lost" : "left to " + front_.taker());
   } else if (button == nullptr) {
     const char* const outcome = !change.grabbed           ? "left to the desktop"
                                 : passThrough_.press(key) ? "handed on to the desktop"

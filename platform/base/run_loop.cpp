@@ -56,6 +56,16 @@ void run(RunLoop& loop) {
 
 std::uint64_t turn() { return theLoop().passes; }
 
+void runPending() {
+  constexpr int kMostPasses = 64;
+  RunLoop& loop = theLoop();
+  if (loop.running) return;
+  loop.running = true;
+  loop.stopped = false;
+  for (int i = 0; i < kMostPasses && !loop.stopped && runPass(loop); ++i) continue;
+  loop.running = false;
+}
+
 }  // namespace base
 
 HostRunLoopRef HostRunLoopCurrent() { return HostRunLoopRef(&base::theLoop()); }

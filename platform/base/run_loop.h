@@ -38,6 +38,10 @@ void waitForSources(std::optional<Nanoseconds> deadline);
 /// A descriptor that polls as readable while a source on the loop has data waiting in the kernel.
 int runLoopDescriptor();
 
+/// Serves what is ready and due by now, of a flood a part, and does not wait: for a program with another loop
+/// of its own, which watches runLoopDescriptor(). Nothing while the loop runs.
+void runPending();
+
 /// Something that becomes readable. The descriptor stays with whoever made the source, must be one that epoll
 /// takes and can stand behind one source on the loop at a time; otherwise the source does not go on.
 struct Source : HostObject {

@@ -1,7 +1,7 @@
 // The program kvd-entries: tells kvd what the desktop entries say.
 //
-// Without an argument it writes a record for each installed program that plays a role or was cast for one,
-// each as soon as it is known; with --default-music-player the identifier of the person's default for music
+// Without an argument it writes a record for each installed program that plays a role, takes the remote itself
+// or was cast for either, each as soon as it is known; with --default-music-player the identifier of the person's default for music
 // files.
 
 #include <gio/gdesktopappinfo.h>
@@ -26,6 +26,8 @@ namespace programs = linux::programs;
 using programs::Role;
 
 constexpr const char* kCastKey = "X-Kvd-Application";
+/// What stands there instead of an identifier where the program takes the remote itself.
+constexpr const char* kOwnRemote = "own-remote";
 constexpr const char* kMusicTypes[] = {"audio/mpeg", "audio/flac", "audio/x-vorbis+ogg"};
 constexpr std::string_view kSuffix = ".desktop";
 
@@ -95,12 +97,14 @@ void report(GDesktopAppInfo* info, const std::string& id) {
   entry.cast = g_desktop_app_info_has_key(info, kCastKey) != FALSE;
   if (entry.cast) {
     entry.role = programs::roleOf(textOf(info, kCastKey));
+    entry.takesRemote = textOf(info, kCastKey) == kOwnRemote;
   } else if (known != nullptr) {
     entry.role = known->role;
+    entry.takesRemote = known->takesRemote;
   } else {
     entry.role = roleByCategories(textOf(g_desktop_app_info_get_categories(info)));
   }
-  if (entry.role == Role::None && !entry.cast) return;
+  if (entry.role == Role::None && !entry.cast && !entry.takesRemote) return;
   entry.windowClass = textOf(g_desktop_app_info_get_startup_wm_class(info));
   entry.busActivatable = g_desktop_app_info_get_boolean(info, "DBusActivatable") != FALSE;
   entry.directory = textOf(info, "Path");

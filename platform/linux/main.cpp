@@ -5,8 +5,7 @@
 #include "platform/base/failure.h"
 #include "platform/base/run_loop.h"
 #include "platform/linux/host/host.h"
-#include "platform/linux/windows/wlr/wlr.h"
-#include "platform/linux/windows/x11/x11.h"
+#include "platform/linux/windows/every_backend.h"
 
 namespace {
 
@@ -40,7 +39,7 @@ int answer(std::string_view argument) {
 int main(int count, char** words) {
   if (count > 1) return answer(count == 2 ? words[1] : "");
   base::endLoopOnSignals();
-  linux::host::init({&linux::windows::wlr::kBackend, &linux::windows::x11::kBackend});
+  linux::host::init(linux::windows::everyBackend());
   const int status = KVDMain();
   if (status != 0) std::fprintf(stderr, "kvd: %s\n", base::lastFailure().c_str());
   linux::host::finish();

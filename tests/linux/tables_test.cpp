@@ -201,6 +201,13 @@ TEST_F(Document, NamesEveryProgram) {
     row.replace(row.size() - 2, 2, " |");
     EXPECT_NE(document().find(row), std::string::npos) << row;
   }
+  const std::string text = document();
+  const std::size_t takers = text.find("These take the remote themselves");
+  for (const Program& program : programs()) {
+    const std::size_t place = text.find(program.name, takers);
+    EXPECT_EQ(program.takesRemote, program.role == Role::None) << program.name;
+    EXPECT_TRUE(!program.takesRemote || place < text.find("\n\n", takers)) << program.name;
+  }
 }
 
 TEST_F(Document, HasARowForEveryWordAndAction) {

@@ -1,6 +1,7 @@
 #!/usr/bin/python3 -B
 """Plays one scene with the programs of a directory. A function that takes a stand is a scene."""
 import os
+import shutil
 import socket
 import struct
 import subprocess
@@ -286,6 +287,48 @@ def pass_through(stand):
     stand.end()
     if connection.recv(100):
         raise Failed("hands on more")
+
+
+def own_remote(stand):
+    """A program that takes the remote itself has it while it is in front, and where nobody can tell, while it runs."""
+    applications = f"{stand.run}/applications"
+    os.mkdir(applications)
+    with open(f"{applications}/television.desktop", "w", encoding="utf-8") as entry:
+        entry.write("[Desktop Entry]\nType=Application\nName=TV\nExec=true\nX-Kvd-Application=own-remote\n")
+    stand.listen()
+    remote = Device("rc0", "Remote", "PLAY VOLUMEUP", **IR)
+    display = stand.start_compositor()
+    stand.show("film")
+    stand.receive(WAYLAND_DISPLAY=display, XDG_DATA_HOME=stand.run)
+    stand.says("unlocked")
+    for name, taker in ("kodi", "Kodi"), ("television", "television"):
+        wait(lambda: remote.grabbed, "grabbed")
+        remote.send(("VOLUMEUP", 1))
+        stand.says("volume-up down")
+        window = stand.show(name)
+        stand.shows(f"{taker} is in front and has the remotes")
+        stays(lambda: remote.grabbed, "a hold ends first")
+        remote.send(("PLAY", 1), ("PLAY", 0), ("VOLUMEUP", 0))
+        stand.says("volume-up up")
+        wait(lambda: not remote.grabbed, "let go of")
+        remote.tap("PLAY")
+        stand.shows(f"left to {taker}")
+        listed = stand.ask("kvd-receiver", "--list", WAYLAND_DISPLAY=display, XDG_DATA_HOME=stand.run).stdout
+        if f"\n{taker} is in front and has the remotes" not in listed:
+            raise Failed(listed)
+        window.kill()
+        stand.shows("kvd has the remotes again")
+    wait(lambda: remote.grabbed, "grabbed")
+    remote.tap("PLAY")
+    stand.says("play down")
+    stand.end()
+    shutil.copy(shutil.which("sleep"), f"{stand.run}/kodi.bin")
+    runs = stand.start(f"{stand.run}/kodi.bin", "3600")
+    stand.receive(WAYLAND_DISPLAY="")
+    stand.shows("Kodi is in front")
+    runs.kill()
+    stand.says("unlocked")
+    stand.end()
 
 
 def stage(stand):

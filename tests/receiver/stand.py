@@ -1,6 +1,8 @@
 """A receiver between remotes and a service port of the test's, with buses and a login manager where they are asked for.
 All that it starts ends with it."""
+import glob
 import os
+import pwd
 import re
 import socket
 import struct
@@ -39,7 +41,7 @@ class Stand:
             process.kill()
             process.wait()
         # Not under the preload library, which leads some versions astray here.
-        subprocess.call(["/bin/rm", "-rf", self.run, BED.get_root_dir()], env={})
+        subprocess.call(["/bin/rm", "-rf", self.run, f"{self.run}-screen", BED.get_root_dir()], env={})
 
     def ask(self, program, *words, prefix=(), **env):
         return subprocess.run([*prefix, f"{self.programs}/{program}", *words], env={**self.env, **env},
@@ -114,6 +116,24 @@ class Stand:
                 told = "nothing"
             if told != expected:
                 raise Failed(f"says {told}, not {expected}\n{self.log()}")
+
+    def start_compositor(self):
+        """Sway, which refuses to run as root; the path of its socket."""
+        where = f"{self.run}-screen"
+        os.mkdir(where, 0o700)
+        user = pwd.getpwnam("nobody")
+        self.as_user = ["setpriv", f"--reuid={user.pw_uid}", f"--regid={user.pw_gid}", "--clear-groups"] * (not os.geteuid())
+        if self.as_user:
+            os.chown(where, user.pw_uid, user.pw_gid)
+        self.screen = {"PATH": "/usr/bin:/bin", "XDG_RUNTIME_DIR": where, "WLR_BACKENDS": "headless",
+                       "WLR_LIBINPUT_NO_DEVICES": "1", "WLR_RENDERER": "pixman", "LANG": "C.UTF-8"}
+        self.start(*self.as_user, "sway", "-c", "/dev/null", env=self.screen, stderr=subprocess.DEVNULL)
+        self.screen["WAYLAND_DISPLAY"] = wait(lambda: glob.glob(f"{where}/wayland-[0-9]"), "a compositor")[0]
+        return self.screen["WAYLAND_DISPLAY"]
+
+    def show(self, name):
+        """A window in front, by its application id."""
+        return self.start(*self.as_user, "foot", "-a", name, "sleep", "3600", env=self.screen, stderr=subprocess.DEVNULL)
 
     def join(self, name):
         try:

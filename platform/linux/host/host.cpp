@@ -1,5 +1,7 @@
 #include "platform/linux/host/host.h"
 
+#include <utility>
+
 #include "platform/base/port_names.h"
 #include "platform/linux/roles/world.h"
 #include "platform/linux/sound/sound.h"
@@ -9,9 +11,9 @@
 
 namespace linux::host {
 
-void init(std::initializer_list<const windows::Backend*> backends) {
+void init(std::vector<const windows::Backend*> backends) {
   base::bootstrapIsThere = [] { return system::bus() != nullptr; };
-  windows::init(backends);
+  windows::init(std::move(backends));
   scripting::setHooks({.world = &roles::world(), .started = nullptr, .ended = nullptr});
 }
 

@@ -1,7 +1,7 @@
 // The real desktop as a host, put together and taken apart.
 #pragma once
 
-#include <initializer_list>
+#include <vector>
 
 #include "platform/linux/windows/backend.h"
 
@@ -9,7 +9,7 @@ namespace linux::host {
 
 /// Puts the host together: what a start needs, the windows by these back ends, what scripts can name.
 /// Connections are made when they are first needed.
-void init(std::initializer_list<const windows::Backend*> backends);
+void init(std::vector<const windows::Backend*> backends);
 
 /// Closes what was opened since. What was sent gets through.
 void finish();

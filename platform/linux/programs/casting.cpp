@@ -15,6 +15,7 @@ Casting decide(const Entry* entry, const Program* program, bool bystander) {
     casting.entry = program->entry;
   }
   casting.byEntry = entry != nullptr && entry->cast;
+  casting.takesRemote = casting.byEntry ? entry->takesRemote : program != nullptr && program->takesRemote;
   if (bystander && !casting.byEntry) return casting;
   if (program != nullptr && !casting.byEntry) {
     casting.role = program->role;

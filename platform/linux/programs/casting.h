@@ -16,6 +16,8 @@ struct Casting {
   const Program* program = nullptr;
   /// The person or packager has written the role into the desktop entry.
   bool byEntry = false;
+  /// It takes the remote itself.
+  bool takesRemote = false;
   /// The desktop entry without ".desktop"; empty where none was found.
   std::string entry;
 };

@@ -14,6 +14,7 @@ constexpr const char* kID = "id";
 constexpr const char* kWindowClass = "windowClass";
 constexpr const char* kRole = "role";
 constexpr const char* kCast = "cast";
+constexpr const char* kTakesRemote = "takesRemote";
 constexpr const char* kBusActivatable = "busActivatable";
 constexpr const char* kDirectory = "directory";
 constexpr const char* kCommand = "command";
@@ -53,6 +54,7 @@ std::string toRecord(const Entry& entry) {
                     {kWindowClass, entry.windowClass},
                     {kRole, bundleIdentifier(entry.role)},
                     {kCast, entry.cast},
+                    {kTakesRemote, entry.takesRemote},
                     {kBusActivatable, entry.busActivatable},
                     {kDirectory, entry.directory},
                     {kCommand, entry.command}};
@@ -66,6 +68,7 @@ std::optional<Entry> fromRecord(std::string_view line) {
               .windowClass = textIn(record, kWindowClass),
               .role = roleOf(textIn(record, kRole)),
               .cast = truthIn(record, kCast),
+              .takesRemote = truthIn(record, kTakesRemote),
               .busActivatable = truthIn(record, kBusActivatable),
               .directory = textIn(record, kDirectory),
               .command = {}};

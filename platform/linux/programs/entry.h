@@ -11,7 +11,8 @@
 
 namespace linux::programs {
 
-/// An installed program that plays a role, by its entry or by the table of well-known programs.
+/// An installed program that plays a role or takes the remote itself, by its entry or by the table of
+/// well-known programs.
 struct Entry {
   /// Without ".desktop".
   std::string id;
@@ -21,6 +22,8 @@ struct Entry {
   /// A person or packager has written the role into the entry (X-Kvd-Application), which goes before all
   /// else. So written with an unknown identifier, or none, the program plays no role.
   bool cast = false;
+  /// It was written there instead that the program takes the remote itself.
+  bool takesRemote = false;
   /// Can be started over the bus by its own name.
   bool busActivatable = false;
   std::string directory;

@@ -32,7 +32,7 @@ namespace spindle = scripting::spindle;
 
 constexpr players::Quirks kBrowser = kNeedsMedia | kIgnoresRate;
 
-// Within a role the first that is installed is the default.
+// Within a role the first that is installed is the default. Those without a role take the remote themselves.
 // One program a row, its actions one a line below it.
 // clang-format off
 constexpr Program kPrograms[] = {
@@ -172,6 +172,18 @@ constexpr Program kPrograms[] = {
          {words::kSpace, Means::Nothing},
          {words::kEscape, Means::Key, "F11"},
      }}},
+
+    {.takesRemote = true, .name = "Kodi", .entry = "kodi", .busName = "kodi", .windowClass = "kodi", .executable = "kodi.bin"},
+    {.takesRemote = true, .name = "Kodi", .entry = "tv.kodi.Kodi", .windowClass = "tv.kodi.Kodi", .executable = "kodi.bin"},
+    {.takesRemote = true, .name = "RetroArch", .entry = "retroarch", .windowClass = "retroarch", .executable = "retroarch"},
+    {.takesRemote = true, .name = "RetroArch", .entry = "org.libretro.RetroArch", .windowClass = "com.libretro.RetroArch", .executable = "retroarch"},
+    {.takesRemote = true, .name = "VDR", .windowClass = "vdr", .executable = "vdr"},
+    {.takesRemote = true, .name = "MythTV", .entry = "mythtv", .windowClass = "mythfrontend", .executable = "mythfrontend"},
+    {.takesRemote = true, .name = "MythTV", .entry = "mythfrontend", .windowClass = "mythfrontend.real", .executable = "mythfrontend.real"},
+    {.takesRemote = true, .name = "Jellyfin Media Player", .entry = "com.github.iwalton3.jellyfin-media-player", .windowClass = "jellyfinmediaplayer", .executable = "jellyfinmediaplayer"},
+    {.takesRemote = true, .name = "Jellyfin Desktop", .entry = "org.jellyfin.JellyfinDesktop", .windowClass = "org.jellyfin.JellyfinDesktop", .executable = "jellyfin-desktop"},
+    {.takesRemote = true, .name = "Plex HTPC", .entry = "tv.plex.PlexHTPC", .windowClass = "Plex HTPC", .executable = "Plex HTPC"},
+    {.takesRemote = true, .name = "Plex", .entry = "tv.plex.PlexDesktop", .windowClass = "Plex", .executable = "Plex"},
 };
 
 constexpr Action kJukebox[] = {

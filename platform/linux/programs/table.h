@@ -42,6 +42,8 @@ enum class ShowStyle : std::uint8_t {
 /// A well-known program. Empty texts are what it does not have.
 struct Program {
   Role role = Role::None;
+  /// It reads a remote's keys itself: they are left to it while it is in front, and it plays no role.
+  bool takesRemote = false;
   const char* name = "";
   /// Its desktop entry, without ".desktop".
   const char* entry = "";
@@ -50,8 +52,8 @@ struct Program {
   /// The class of its windows (the second part of WM_CLASS), in any case.
   const char* windowClass = "";
   players::Quirks quirks = players::kNoQuirk;
-  /// Its channel, and the executable that opens it.
   players::ChannelKind channel = players::ChannelKind::None;
+  /// The name of the file that it runs: who opens the channel, or takes the remote.
   const char* executable = "";
   ShowStyle show = ShowStyle::FullScreen;
   /// The action whose state tells, where one does.

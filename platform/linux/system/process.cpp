@@ -1,13 +1,17 @@
 #include "platform/linux/system/process.h"
 
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <array>
+#include <charconv>
 #include <cstdint>
+#include <filesystem>
 #include <fstream>
 #include <iterator>
 #include <sstream>
 #include <string_view>
+#include <system_error>
 
 namespace linux::system {
 
@@ -28,6 +32,21 @@ std::string executableName(pid_t process) {
   constexpr std::string_view kReplaced = " (deleted)";
   if (path.ends_with(kReplaced)) path.resize(path.size() - kReplaced.size());
   return path.substr(path.rfind('/') + 1);
+}
+
+std::vector<pid_t> ownProcesses() {
+  std::vector<pid_t> processes;
+  std::error_code error;
+  for (std::filesystem::directory_iterator found("/proc", error), end; !error && found != end;
+       found.increment(error)) {
+    const std::string name = found->path().filename();
+    pid_t process = 0;
+    const auto [rest, failure] = std::from_chars(name.data(), name.data() + name.size(), process);
+    if (failure != std::errc() || rest != name.data() + name.size()) continue;
+    struct stat owned {};
+    if (stat(found->path().c_str(), &owned) == 0 && owned.st_uid == getuid()) processes.push_back(process);
+  }
+  return processes;
 }
 
 std::uint32_t startTime(pid_t process) {

@@ -4,6 +4,7 @@
 #include <cstddef>
 #include <optional>
 #include <string_view>
+#include <utility>
 
 #include "platform/text/case.h"
 
@@ -141,7 +142,7 @@ bool coversMost(const Area& area, const Area& output) {
 
 }  // namespace
 
-void init(std::initializer_list<const Backend*> backends) { sBackends = backends; }
+void init(std::vector<const Backend*> backends) { sBackends = std::move(backends); }
 
 void finish() {
   for (const Backend* backend : sBackends) backend->close();
@@ -170,6 +171,8 @@ const Window* front() {
       std::find_if(sWindows.begin(), sWindows.end(), [](const Window& window) { return window.isActive; });
   return found != sWindows.end() ? &*found : nullptr;
 }
+
+bool knowsFront() { return frontAuthority() != nullptr; }
 
 std::vector<Window> look(std::span<const ID> windows) {
   std::vector<Window> looked;

@@ -5,7 +5,6 @@
 #pragma once
 
 #include <cstdint>
-#include <initializer_list>
 #include <span>
 #include <vector>
 
@@ -14,7 +13,7 @@
 namespace linux::windows {
 
 /// The back ends to be asked from here on; where two know the same, the earlier one is believed.
-void init(std::initializer_list<const Backend*> backends);
+void init(std::vector<const Backend*> backends);
 /// Closes them.
 void finish();
 
@@ -30,6 +29,8 @@ const std::vector<Window>& list();
 
 /// The active window; null where there is none, and where nobody can tell.
 const Window* front();
+/// Whether anybody can tell.
+bool knowsFront();
 
 /// These windows as they look now, those that have gone left out.
 std::vector<Window> look(std::span<const ID> windows);
