@@ -23,6 +23,8 @@ using Modifiers = std::uint8_t;
 /// A back end. None of its functions waits longer than a question may take; a window that has gone is as good
 /// as one that does nothing. What a back end lacks it takes from kNone (none.h).
 struct Backend {
+  /// Called before all others; null where nothing is to be prepared.
+  void (*init)() = nullptr;
   /// Makes the connection, where there is none, at most once a turn of the run loop. Whether there is one.
   bool (*open)();
   /// Closes the connection for good.

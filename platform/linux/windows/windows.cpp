@@ -142,7 +142,12 @@ bool coversMost(const Area& area, const Area& output) {
 
 }  // namespace
 
-void init(std::vector<const Backend*> backends) { sBackends = std::move(backends); }
+void init(std::vector<const Backend*> backends) {
+  sBackends = std::move(backends);
+  for (const Backend* backend : sBackends) {
+    if (backend->init != nullptr) backend->init();
+  }
+}
 
 void finish() {
   for (const Backend* backend : sBackends) backend->close();

@@ -5,21 +5,21 @@
 
 namespace linux::windows::wlr {
 
-void findProcesses(pid_t compositor, const std::vector<Toplevel*>& windows) {
-  std::vector<Toplevel*> unknown;
+void findProcesses(pid_t compositor, const std::vector<wayland::Toplevel*>& windows) {
+  std::vector<wayland::Toplevel*> unknown;
   std::ranges::copy_if(windows, std::back_inserter(unknown),
-                       [](const Toplevel* window) { return window->container == 0; });
+                       [](const wayland::Toplevel* window) { return window->container == 0; });
   if (unknown.empty()) return;
   std::vector<Container> containers = readContainers(compositor);
   const auto isTaken = [&](const Container& container) {
-    return std::ranges::find(windows, container.id, &Toplevel::container) != windows.end();
+    return std::ranges::find(windows, container.id, &wayland::Toplevel::container) != windows.end();
   };
   std::erase_if(containers, isTaken);
   // Both sides in the order in which the windows were opened, so that those which nothing else tells apart
   // meet as they should. A title may have changed between the two tellings.
-  std::ranges::sort(unknown, {}, &Toplevel::age);
+  std::ranges::sort(unknown, {}, &wayland::Toplevel::age);
   for (const bool byTitle : {true, false}) {
-    for (Toplevel* const window : unknown) {
+    for (wayland::Toplevel* const window : unknown) {
       if (window->container != 0) continue;
       const auto same = std::ranges::find_if(containers, [&](const Container& container) {
         return container.applicationID == window->description.applicationID &&
@@ -33,7 +33,7 @@ void findProcesses(pid_t compositor, const std::vector<Toplevel*>& windows) {
   }
 }
 
-std::optional<Container> lookAt(pid_t compositor, const Toplevel& window) {
+std::optional<Container> lookAt(pid_t compositor, const wayland::Toplevel& window) {
   const auto containers = readContainers(compositor);
   const auto found = std::ranges::find(containers, window.container, &Container::id);
   if (found == containers.end()) return std::nullopt;

@@ -7,15 +7,15 @@
 #include <optional>
 #include <vector>
 
+#include "platform/linux/windows/wayland/toplevels.h"
 #include "platform/linux/windows/wlr/sway.h"
-#include "platform/linux/windows/wlr/toplevels.h"
 
 namespace linux::windows::wlr {
 
 /// Asks the compositor for the processes of those windows that have none yet.
-void findProcesses(pid_t compositor, const std::vector<Toplevel*>& windows);
+void findProcesses(pid_t compositor, const std::vector<wayland::Toplevel*>& windows);
 
 /// Asks for the window as it is now; nothing where the compositor does not tell.
-std::optional<Container> lookAt(pid_t compositor, const Toplevel& window);
+std::optional<Container> lookAt(pid_t compositor, const wayland::Toplevel& window);
 
 }  // namespace linux::windows::wlr

@@ -1,11 +1,16 @@
 #include "platform/linux/windows/wlr/wlr.h"
 
+#include <optional>
+
 #include "foreign_toplevel.h"
-#include "platform/linux/windows/wlr/connection.h"
-#include "platform/linux/windows/wlr/keyboard.h"
-#include "platform/linux/windows/wlr/outputs.h"
+#include "platform/linux/windows/wayland/connection.h"
+#include "platform/linux/windows/wayland/keyboard.h"
+#include "platform/linux/windows/wayland/outputs.h"
+#include "platform/linux/windows/wayland/seat.h"
+#include "platform/linux/windows/wayland/toplevel_windows.h"
+#include "platform/linux/windows/wayland/toplevels.h"
+#include "platform/linux/windows/wlr/foreign_toplevels.h"
 #include "platform/linux/windows/wlr/processes.h"
-#include "platform/linux/windows/wlr/toplevels.h"
 
 namespace linux::windows::wlr {
 
@@ -15,83 +20,66 @@ std::vector<Window> sWindows;
 /// toplevelChanges() when they were read.
 unsigned sChanges = 0;
 
-Window windowOf(const Toplevel& toplevel) {
-  const Description& told = toplevel.description;
-  Window window;
-  window.id = {&kBackend, toplevel.number};
-  window.process = toplevel.process;
-  // It stands for the class too: programs have the same text there, and change it as they change their class.
-  window.applicationID = window.className = told.applicationID;
-  window.isDialog = told.isDialog;
-  window.isActive = told.isActive;
-  window.title = told.title;
-  window.isFullScreen = told.isFullScreen && !told.isMinimized;
-  window.isShown = !told.isMinimized;
-  window.area = areaOf(told.outputs);
-  return window;
+constexpr wayland::Interest kInterests[] = {{&zwlr_foreign_toplevel_manager_v1_interface, takeManager}};
+
+extern const wayland::Part kPart;
+
+void begin() {
+  wayland::noteAllAreKnown();
+  if (wayland::speaks(kPart)) wayland::plugInKeyboard();
 }
 
-bool isConnected() { return connection() != nullptr; }
+const wayland::Part kPart{.interests = kInterests, .isTold = hasManager, .begin = begin, .end = dropManager};
+
+bool isConnected() { return wayland::connection() != nullptr && wayland::speaks(kPart); }
 
 bool takeIn() {
-  connection();
-  if (sChanges == toplevelChanges()) return false;
-  sChanges = toplevelChanges();
-  const auto told = toplevels();
-  findProcesses(compositor(), told);
+  isConnected();
+  if (sChanges == wayland::toplevelChanges()) return false;
+  sChanges = wayland::toplevelChanges();
+  const auto told = hasManager() ? wayland::toplevels() : std::vector<wayland::Toplevel*>();
+  findProcesses(wayland::compositor(), told);
   sWindows.clear();
-  for (const Toplevel* const toplevel : told) sWindows.push_back(windowOf(*toplevel));
+  for (const wayland::Toplevel* const toplevel : told) {
+    sWindows.push_back(wayland::windowOf(*toplevel, kBackend));
+  }
   return true;
 }
 
 void look(std::span<Window> windows) {
-  connection();
+  wayland::connection();
   for (Window& window : windows) {
-    const Toplevel* const toplevel = findToplevel(window.id.number);
-    if (toplevel == nullptr) {
-      window.isFullScreen = window.isShown = false;
-      continue;
-    }
-    const bool isActive = window.isActive;
-    window = windowOf(*toplevel);
-    window.isActive = isActive;
+    if (!wayland::lookAgain(window) || !window.isFullScreen) continue;
     // Sway tells of full screen on workspaces that are not shown too, and since 1.10 of no outputs.
-    const auto container = window.isFullScreen ? lookAt(compositor(), *toplevel) : std::nullopt;
+    const auto container = lookAt(wayland::compositor(), *wayland::findToplevel(window.id.number));
     if (!container) continue;
     window.isShown = container->isVisible;
-    if (const Area area = areaOf(container->output); area.width > 0) window.area = area;
+    if (const Area area = wayland::areaOf(container->output); area.width > 0) window.area = area;
   }
 }
 
-void activate(std::uint64_t window) {
-  connection();
-  const Toplevel* const toplevel = findToplevel(window);
-  if (toplevel == nullptr || seat() == nullptr) return;
-  zwlr_foreign_toplevel_handle_v1_activate(toplevel->handle, seat());
-  flush();
-}
-
-bool sendKey(std::uint64_t window, std::uint32_t keysym, bool down, Modifiers modifiers) {
-  connection();
-  const Toplevel* const toplevel = findToplevel(window);
-  // Whoever has come to the front meanwhile must not get it; a release is owed whoever is there.
-  if (down && (toplevel == nullptr || !toplevel->description.isActive)) return false;
-  return tapKey(keysym, down, modifiers) && flush();
+void bringToFront(std::uint64_t window) {
+  wayland::connection();
+  const wayland::Toplevel* const toplevel = wayland::findToplevel(window);
+  if (toplevel == nullptr || wayland::seat() == nullptr) return;
+  activate(*toplevel, wayland::seat());
+  wayland::flush();
 }
 
 }  // namespace
 
 const Backend kBackend{
+    .init = [] { wayland::join(kPart); },
     .open = isConnected,
-    .close = disconnect,
+    .close = wayland::disconnect,
     .takeIn = takeIn,
     .list = []() -> const std::vector<Window>& { return sWindows; },
     .look = look,
-    .knowsFront = [] { return isConnected() && followsToplevels(); },
-    .reach = [] { return isConnected() && hasKeyboard() ? Reach::FocusedWindow : Reach::Nobody; },
-    .activate = activate,
-    .sendKey = sendKey,
-    .outputs = [] { return isConnected() && followsToplevels() ? outputs() : std::vector<Output>(); },
+    .knowsFront = isConnected,
+    .reach = [] { return isConnected() && wayland::hasKeyboard() ? Reach::FocusedWindow : Reach::Nobody; },
+    .activate = bringToFront,
+    .sendKey = wayland::sendKey,
+    .outputs = [] { return isConnected() ? wayland::outputs() : std::vector<Output>(); },
 };
 
 }  // namespace linux::windows::wlr

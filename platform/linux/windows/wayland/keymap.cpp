@@ -1,4 +1,4 @@
-#include "platform/linux/windows/wlr/keymap.h"
+#include "platform/linux/windows/wayland/keymap.h"
 
 #include <xkbcommon/xkbcommon.h>
 
@@ -6,7 +6,7 @@
 #include <memory>
 #include <utility>
 
-namespace linux::windows::wlr {
+namespace linux::windows::wayland {
 
 namespace {
 
@@ -59,4 +59,4 @@ std::uint32_t maskOf(Modifiers modifiers) {
   return mask;
 }
 
-}  // namespace linux::windows::wlr
+}  // namespace linux::windows::wayland

@@ -4,20 +4,22 @@
 #include <cstdint>
 
 #include "platform/linux/windows/backend.h"
+#include "platform/linux/windows/wayland/connection.h"
 
-struct wl_seat;
-struct zwp_virtual_keyboard_manager_v1;
+namespace linux::windows::wayland {
 
-namespace linux::windows::wlr {
+/// Keeps what makes keyboards.
+void takeKeyboards(const Offer& offer);
+void dropKeyboards();
 
-/// Plugs it in; there is none where the keyboard cannot be described.
-void makeKeyboard(zwp_virtual_keyboard_manager_v1* manager, wl_seat* seat);
+/// Plugs one in; there is none where the compositor makes none, there is no seat, or it cannot be described.
+void plugInKeyboard();
 /// Pulls it out, which releases its keys.
-void dropKeyboard();
+void pullOutKeyboard();
 bool hasKeyboard();
 
 /// Presses or releases a key; what comes of it is on its way with the connection's next flush. False when it
 /// has no such key, and for the release of one that is not down.
 bool tapKey(std::uint32_t keysym, bool down, Modifiers modifiers);
 
-}  // namespace linux::windows::wlr
+}  // namespace linux::windows::wayland

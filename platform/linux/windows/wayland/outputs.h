@@ -6,14 +6,14 @@
 #include <string_view>
 #include <vector>
 
+#include "platform/linux/windows/wayland/connection.h"
 #include "platform/linux/windows/window.h"
 
 struct wl_output;
 
-namespace linux::windows::wlr {
+namespace linux::windows::wayland {
 
-/// Takes over an output, which the compositor calls by this number.
-void addOutput(std::uint32_t name, wl_output* output);
+void addOutput(const Offer& offer);
 /// Nothing happens when the number is no output's.
 void removeOutput(std::uint32_t name);
 void forgetOutputs();
@@ -26,5 +26,7 @@ std::vector<Output> outputs();
 Area areaOf(std::span<wl_output* const> entered);
 /// The same for the output with this name, as "HDMI-A-1".
 Area areaOf(std::string_view name);
+/// The same for the output whose upper left corner is there in the compositor's own space.
+Area areaAt(int x, int y);
 
-}  // namespace linux::windows::wlr
+}  // namespace linux::windows::wayland

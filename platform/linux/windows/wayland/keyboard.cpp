@@ -1,4 +1,4 @@
-#include "platform/linux/windows/wlr/keyboard.h"
+#include "platform/linux/windows/wayland/keyboard.h"
 
 #include <sys/mman.h>
 #include <wayland-client.h>
@@ -8,13 +8,15 @@
 #include <utility>
 
 #include "platform/base/file_descriptor.h"
-#include "platform/linux/windows/wlr/keymap.h"
+#include "platform/linux/windows/wayland/keymap.h"
+#include "platform/linux/windows/wayland/seat.h"
 #include "virtual_keyboard.h"
 
-namespace linux::windows::wlr {
+namespace linux::windows::wayland {
 
 namespace {
 
+zwp_virtual_keyboard_manager_v1* sManager = nullptr;
 zwp_virtual_keyboard_v1* sKeyboard = nullptr;
 std::map<std::uint32_t, Place> sPlaces;
 /// The keys that are down.
@@ -28,19 +30,32 @@ std::uint32_t milliseconds() {
 
 }  // namespace
 
-void makeKeyboard(zwp_virtual_keyboard_manager_v1* manager, wl_seat* seat) {
+void takeKeyboards(const Offer& offer) {
+  if (sManager != nullptr) return;
+  sManager = static_cast<zwp_virtual_keyboard_manager_v1*>(
+      accept(offer, zwp_virtual_keyboard_manager_v1_interface, 1));
+}
+
+void dropKeyboards() {
+  pullOutKeyboard();
+  if (sManager != nullptr) zwp_virtual_keyboard_manager_v1_destroy(sManager);
+  sManager = nullptr;
+}
+
+void plugInKeyboard() {
+  if (sManager == nullptr || seat() == nullptr) return;
   Keymap keymap = makeKeymap();
   // xkb's text ends with a NUL on the wire.
   const std::size_t size = keymap.text.size() + 1;
   const base::FileDescriptor file(memfd_create("keymap", MFD_CLOEXEC));
   if (keymap.places.empty() || !base::writeAll(file, {keymap.text.c_str(), size})) return;
-  sKeyboard = zwp_virtual_keyboard_manager_v1_create_virtual_keyboard(manager, seat);
+  sKeyboard = zwp_virtual_keyboard_manager_v1_create_virtual_keyboard(sManager, seat());
   zwp_virtual_keyboard_v1_keymap(sKeyboard, WL_KEYBOARD_KEYMAP_FORMAT_XKB_V1, file.get(),
                                  static_cast<std::uint32_t>(size));
   sPlaces = std::move(keymap.places);
 }
 
-void dropKeyboard() {
+void pullOutKeyboard() {
   if (sKeyboard != nullptr) zwp_virtual_keyboard_v1_destroy(sKeyboard);
   sKeyboard = nullptr;
   sDown.clear();
@@ -63,4 +78,4 @@ bool tapKey(std::uint32_t keysym, bool down, Modifiers modifiers) {
   return true;
 }
 
-}  // namespace linux::windows::wlr
+}  // namespace linux::windows::wayland

@@ -1,4 +1,4 @@
-#include "platform/linux/windows/wlr/connection.h"
+#include "platform/linux/windows/wayland/connection.h"
 
 #include <poll.h>
 #include <unistd.h>
@@ -11,8 +11,8 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
-#include "foreign_toplevel.h"
 #include "platform/base/deadline.h"
 #include "platform/base/file_descriptor.h"
 #include "platform/base/run_loop.h"
@@ -20,12 +20,12 @@
 #include "platform/linux/system/local_socket.h"
 #include "platform/linux/system/turn.h"
 #include "platform/linux/windows/session.h"
-#include "platform/linux/windows/wlr/keyboard.h"
-#include "platform/linux/windows/wlr/outputs.h"
-#include "platform/linux/windows/wlr/toplevels.h"
+#include "platform/linux/windows/wayland/keyboard.h"
+#include "platform/linux/windows/wayland/outputs.h"
+#include "platform/linux/windows/wayland/seat.h"
 #include "virtual_keyboard.h"
 
-namespace linux::windows::wlr {
+namespace linux::windows::wayland {
 
 namespace {
 
@@ -36,29 +36,28 @@ constexpr int kMostReads = 16;
 wl_display* sDisplay = nullptr;
 pid_t sCompositor = 0;
 wl_registry* sRegistry = nullptr;
-wl_seat* sSeat = nullptr;
-zwp_virtual_keyboard_manager_v1* sKeyboards = nullptr;
 base::Owned<base::Source> sSource;
 /// The turn in which a connection was last tried.
 std::optional<std::uint64_t> sTried;
 
-template <typename Proxy>
-Proxy* bind(std::uint32_t name, const wl_interface& interface, std::uint32_t version) {
-  return static_cast<Proxy*>(wl_registry_bind(sRegistry, name, &interface, version));
-}
+std::vector<const Part*> sParts;
 
-void addGlobal(void*, wl_registry*, std::uint32_t name, const char* interface, std::uint32_t version) {
-  const auto is = [&](const wl_interface& known) { return std::string_view(interface) == known.name; };
-  if (is(wl_output_interface)) {
-    addOutput(name, bind<wl_output>(name, wl_output_interface, std::min(version, 4U)));
-  } else if (is(wl_seat_interface) && sSeat == nullptr) {
-    sSeat = bind<wl_seat>(name, wl_seat_interface, 1);
-  } else if (is(zwlr_foreign_toplevel_manager_v1_interface) && !followsToplevels()) {
-    followToplevels(bind<zwlr_foreign_toplevel_manager_v1>(name, zwlr_foreign_toplevel_manager_v1_interface,
-                                                           std::min(version, 3U)));
-  } else if (is(zwp_virtual_keyboard_manager_v1_interface) && sKeyboards == nullptr) {
-    sKeyboards = bind<zwp_virtual_keyboard_manager_v1>(name, zwp_virtual_keyboard_manager_v1_interface, 1);
-  }
+/// What every part may need.
+constexpr Interest kShared[] = {
+    {&wl_output_interface, addOutput},
+    {&wl_seat_interface, takeSeat},
+    {&zwp_virtual_keyboard_manager_v1_interface, takeKeyboards},
+};
+
+void addGlobal(void*, wl_registry* registry, std::uint32_t name, const char* interface,
+               std::uint32_t version) {
+  const auto offerTo = [&](std::span<const Interest> interests) {
+    for (const Interest& interest : interests) {
+      if (std::string_view(interface) == interest.interface->name) interest.take({registry, name, version});
+    }
+  };
+  offerTo(kShared);
+  for (const Part* const part : sParts) offerTo(part->interests);
 }
 
 constexpr wl_registry_listener kRegistryListener{
@@ -77,11 +76,10 @@ void loseConnection() {
     HostRunLoopRemoveSource(HostRunLoopCurrent(), HostSourceRef(sSource.get()), HostRunLoopMode::Default);
     sSource.reset();
   }
-  dropKeyboard();
-  forgetToplevels();
+  for (const Part* const part : sParts) part->end();
+  dropKeyboards();
   forgetOutputs();
-  drop(sKeyboards, zwp_virtual_keyboard_manager_v1_destroy);
-  drop(sSeat, wl_seat_destroy);
+  dropSeat();
   drop(sRegistry, wl_registry_destroy);
   drop(sDisplay, wl_display_disconnect);
   sCompositor = 0;
@@ -145,20 +143,36 @@ bool connectToCompositor() {
   wl_registry_add_listener(sRegistry, &kRegistryListener, nullptr);
   const system::Limit limit = system::patience(system::kQueryLimit);
   const base::Deadline deadline(limit);
-  // First what there is, then what that tells of itself.
-  if (!awaitAll(deadline) || !awaitAll(deadline)) {
+  // First what there is, then what that tells of itself, then what it was asked for on being told.
+  if (!awaitAll(deadline) || !awaitAll(deadline) || !awaitAll(deadline)) {
     if (deadline.hasPassed()) system::noteWaitInVain(limit);
     loseConnection();
     return false;
   }
-  noteAllAreKnown();
-  if (sKeyboards != nullptr && sSeat != nullptr && followsToplevels()) makeKeyboard(sKeyboards, sSeat);
+  for (const Part* const part : sParts) part->begin();
   flush();
   putOnLoop();
   return true;
 }
 
 }  // namespace
+
+void* accept(const Offer& offer, const wl_interface& interface, std::uint32_t newest) {
+  return wl_registry_bind(offer.registry, offer.name, &interface, std::min(offer.version, newest));
+}
+
+void join(const Part& part) {
+  if (std::ranges::find(sParts, &part) == sParts.end()) sParts.push_back(&part);
+}
+
+bool speaks(const Part& part) {
+  const auto first = std::ranges::find_if(sParts, [](const Part* each) { return each->isTold(); });
+  return first != sParts.end() && *first == &part;
+}
+
+bool nobodySpeaks() {
+  return sDisplay != nullptr && std::ranges::none_of(sParts, [](const Part* each) { return each->isTold(); });
+}
 
 wl_display* connection() {
   if (sDisplay != nullptr) takeInEvents();
@@ -173,8 +187,6 @@ void disconnect() { loseConnection(); }
 
 pid_t compositor() { return sCompositor; }
 
-wl_seat* seat() { return sSeat; }
-
 bool flush() { return sDisplay != nullptr && (wl_display_flush(sDisplay) >= 0 || errno == EAGAIN); }
 
-}  // namespace linux::windows::wlr
+}  // namespace linux::windows::wayland

@@ -1,4 +1,4 @@
-#include "platform/linux/windows/wlr/outputs.h"
+#include "platform/linux/windows/wayland/outputs.h"
 
 #include <wayland-client.h>
 
@@ -6,15 +6,18 @@
 #include <memory>
 #include <string>
 
-#include "platform/linux/windows/wlr/toplevels.h"
+#include "platform/linux/windows/wayland/toplevels.h"
 
-namespace linux::windows::wlr {
+namespace linux::windows::wayland {
 
 namespace {
 
 struct Known {
   wl_output* proxy = nullptr;
   Output output;
+  /// Where the compositor has it.
+  int x = 0;
+  int y = 0;
   std::string name;
 };
 
@@ -31,8 +34,14 @@ void setMode(void* data, wl_output*, std::uint32_t flags, std::int32_t width, st
   }
 }
 
+void setPlace(void* data, wl_output*, std::int32_t x, std::int32_t y, std::int32_t, std::int32_t,
+              std::int32_t, const char*, const char*, std::int32_t) {
+  static_cast<Known*>(data)->x = x;
+  static_cast<Known*>(data)->y = y;
+}
+
 constexpr wl_output_listener kListener{
-    .geometry = [](void*, auto*, int, int, int, int, int, const char*, const char*, int) {},
+    .geometry = setPlace,
     .mode = setMode,
     .done = [](void*, auto*) {},
     .scale = [](void*, auto*, int) {},
@@ -51,9 +60,10 @@ void destroy(const Known& known) {
 
 }  // namespace
 
-void addOutput(std::uint32_t name, wl_output* output) {
-  const auto& known = sOutputs.emplace_back(new Known{output, {name, {}}, {}});
-  wl_output_add_listener(output, &kListener, known.get());
+void addOutput(const Offer& offer) {
+  auto* const proxy = static_cast<wl_output*>(accept(offer, wl_output_interface, 4));
+  const auto& known = sOutputs.emplace_back(new Known{proxy, {offer.name, {}}, 0, 0, {}});
+  wl_output_add_listener(proxy, &kListener, known.get());
 }
 
 void removeOutput(std::uint32_t name) {
@@ -88,9 +98,15 @@ Area areaOf(std::span<wl_output* const> entered) {
   return area;
 }
 
+Area areaAt(int x, int y) {
+  const auto there =
+      std::ranges::find_if(sOutputs, [&](const auto& known) { return known->x == x && known->y == y; });
+  return there != sOutputs.end() ? (*there)->output.area : Area{};
+}
+
 Area areaOf(std::string_view name) {
   const auto named = std::ranges::find(sOutputs, name, [](const auto& known) { return known->name; });
   return named != sOutputs.end() ? (*named)->output.area : Area{};
 }
 
-}  // namespace linux::windows::wlr
+}  // namespace linux::windows::wayland

@@ -1,4 +1,4 @@
-// The windows of which the compositor tells, by events alone.
+// The windows of which a compositor tells by events alone, whichever its protocol is.
 #pragma once
 
 #include <sys/types.h>
@@ -8,11 +8,8 @@
 #include <vector>
 
 struct wl_output;
-struct wl_seat;
-struct zwlr_foreign_toplevel_handle_v1;
-struct zwlr_foreign_toplevel_manager_v1;
 
-namespace linux::windows::wlr {
+namespace linux::windows::wayland {
 
 /// What is told of a window; changes of it come together.
 struct Description {
@@ -31,7 +28,10 @@ struct Toplevel {
   std::uint64_t number = 0;
   /// The later a window was opened, the greater.
   std::int64_t age = 0;
-  zwlr_foreign_toplevel_handle_v1* handle = nullptr;
+  /// What the protocol knows it by, and owns.
+  void* handle = nullptr;
+  /// Another one, where a second protocol tells the rest.
+  void* details = nullptr;
   Description description;
   /// What has been told since the last of its changes was complete.
   Description next;
@@ -43,15 +43,19 @@ struct Toplevel {
   std::int64_t container = 0;
 };
 
-/// Begins to listen to the manager, which it owns from here on.
-void followToplevels(zwlr_foreign_toplevel_manager_v1* manager);
+/// Begins with none.
+void beginToplevels();
 /// From here on those that come are new: the first to be told of are those that were there, the last that was
 /// opened first.
 void noteAllAreKnown();
-/// Ends that, and forgets all of them.
-void forgetToplevels();
-/// Whether a compositor is followed that tells of windows.
-bool followsToplevels();
+
+/// A window of which nothing is known yet. Borrowed, until it is removed.
+Toplevel& addToplevel(void* handle);
+/// What has been told of it is complete.
+void completeToplevel(Toplevel& toplevel);
+void removeToplevel(const Toplevel& toplevel);
+/// Removes all, each after a last look at it.
+void forgetToplevels(void (*last)(const Toplevel& toplevel));
 
 /// All of them, those described too; the last that was active or opened first.
 std::vector<Toplevel*> toplevels();
@@ -64,4 +68,4 @@ unsigned toplevelChanges();
 /// An output has gone.
 void leaveOutput(wl_output* output);
 
-}  // namespace linux::windows::wlr
+}  // namespace linux::windows::wayland

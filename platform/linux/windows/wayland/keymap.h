@@ -7,7 +7,7 @@
 
 #include "platform/linux/windows/backend.h"
 
-namespace linux::windows::wlr {
+namespace linux::windows::wayland {
 
 /// A key by its evdev code, and the modifiers that make it yield a symbol.
 struct Place {
@@ -29,4 +29,4 @@ Keymap makeKeymap();
 /// Modifiers in the bits that this keyboard has for them.
 std::uint32_t maskOf(Modifiers modifiers);
 
-}  // namespace linux::windows::wlr
+}  // namespace linux::windows::wayland
