@@ -42,7 +42,7 @@ void leaveWindows() {
 }  // namespace
 
 std::string takerNow() {
-  windows::init(windows::everyBackend());
+  windows::init(windows::everyBackend(), windows::Use::Looking);
   takeInWindows();
   std::string taker = programs::takerOfRemote();
   leaveWindows();
@@ -68,7 +68,7 @@ void Front::follow(bool on) {
   if (on == following_) return;
   following_ = on;
   if (on) {
-    windows::init(windows::everyBackend());
+    windows::init(windows::everyBackend(), windows::Use::Looking);
     takeIn();
   } else {
     leaveWindows();

@@ -16,6 +16,7 @@ namespace {
 constexpr std::uint32_t kMostBackends = 8;
 
 std::vector<const Backend*> sBackends;
+Use sUse = Use::Typing;
 
 /// The merged windows, and by what ids their back ends know each, in the order of the back ends.
 std::vector<Window> sWindows;
@@ -142,8 +143,9 @@ bool coversMost(const Area& area, const Area& output) {
 
 }  // namespace
 
-void init(std::vector<const Backend*> backends) {
+void init(std::vector<const Backend*> backends, Use use) {
   sBackends = std::move(backends);
+  sUse = use;
   for (const Backend* backend : sBackends) {
     if (backend->init != nullptr) backend->init();
   }
@@ -154,6 +156,8 @@ void finish() {
   init({});
   merge();
 }
+
+bool keysAreWanted() { return sUse == Use::Typing; }
 
 bool isOpen() {
   return std::any_of(sBackends.begin(), sBackends.end(),

@@ -12,8 +12,12 @@
 
 namespace linux::windows {
 
-/// The back ends to be asked from here on; where two know the same, the earlier one is believed.
-void init(std::vector<const Backend*> backends);
+/// What windows are wanted for.
+enum class Use : std::uint8_t { Looking, Typing };
+
+/// The back ends to be asked from here on; where two know the same, the earlier one is believed. Who only looks
+/// can send no keys, and has no keyboards made.
+void init(std::vector<const Backend*> backends, Use use = Use::Typing);
 /// Closes them.
 void finish();
 

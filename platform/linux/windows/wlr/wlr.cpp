@@ -26,7 +26,7 @@ extern const wayland::Part kPart;
 
 void begin() {
   wayland::noteAllAreKnown();
-  if (wayland::speaks(kPart)) wayland::plugInKeyboard();
+  if (keysAreWanted() && wayland::speaks(kPart)) wayland::plugInKeyboard();
 }
 
 const wayland::Part kPart{.interests = kInterests, .isTold = hasManager, .begin = begin, .end = dropManager};
