@@ -48,7 +48,8 @@ struct Backend {
   std::vector<Output> (*outputs)();
 };
 
-/// Whether keys will be sent. A back end gets ready for them with the connection, as the first must not be late.
+/// Whether keys will be sent. A back end gets ready for them with the connection, as the first must not be
+/// late.
 bool keysAreWanted();
 
 }  // namespace linux::windows
