@@ -10,18 +10,15 @@
 
 namespace terminal {
 
-using stage::Application;
-
 void LastTarget::note(const stage::JournalLine& line) {
   // What a timer does in a later turn of the loop is no longer about the choice.
   if (choosing_ && base::turn() != turn_) settle();
   if (line.question == stage::Question::WhoIsInFront && sTargetApplication == App::Nval) {
     choosing_ = true;
     turn_ = base::turn();
-    front_ = line.about;
-    asked_.clear();
+    choice_.begin(line.about != nullptr ? line.about->identifier : "");
   } else if (line.question == stage::Question::WhoRuns) {
-    ++asked_[line.about];
+    choice_.noteAsked(line.about->identifier);
   } else if (line.kind == stage::Entry::SoundKey) {
     soundKey_ = true;
   }
@@ -39,37 +36,11 @@ void LastTarget::settle() {
   }
 }
 
-LastTarget::Reason LastTarget::reasonFor(const Application* target) const {
-  if (target == front_) return Reason::InFront;
-  const auto asked = asked_.find(target);
-  if (asked != asked_.end() && asked->second == 1) return Reason::Plays;
-  return target == remembered_ ? Reason::ChosenLast : Reason::RunsFirst;
-}
-
 void LastTarget::conclude(AppCode target) {
-  const Application* const application = applicationOf(target);
-  if (application == nullptr) {
-    remembered_ = nullptr;
-    text_ = L"nobody: no player is in front, plays or runs";
-    return;
-  }
-  text_ = widen(application->name) + L": ";
-  switch (reasonFor(application)) {
-    case Reason::InFront:
-      remembered_ = application;
-      text_ += L"it is in front";
-      break;
-    case Reason::Plays:
-      remembered_ = application;
-      text_ += target == App::Spin ? L"it plays or shows its menu" : L"it plays";
-      break;
-    case Reason::ChosenLast:
-      text_ += L"it was chosen last";
-      break;
-    case Reason::RunsFirst:
-      remembered_ = nullptr;
-      text_ += L"it is the first player that runs";
-  }
+  const stage::Application* const application = applicationOf(target);
+  const telling::Reason reason = choice_.conclude(application != nullptr ? application->identifier : "");
+  text_ = widen(application != nullptr ? application->name : "nobody") + L": " +
+          widen(telling::wordsFor(reason, target));
 }
 
 }  // namespace terminal

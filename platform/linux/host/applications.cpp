@@ -1,13 +1,13 @@
-// Running applications, and events for one of them, as the host interface asks for them.
+// Running applications, as the host interface asks for them.
 
-#include <string>
+#include <utility>
 #include <vector>
 
 #include "platform/base/application_information.h"
 #include "platform/base/values.h"
 #include "platform/host.h"
+#include "platform/linux/host/listener.h"
 #include "platform/linux/programs/running.h"
-#include "platform/tarnscript/tarnscript.h"
 
 namespace {
 
@@ -18,13 +18,7 @@ using programs::Role;
 /// Photo programs are spoken to in the words of this generation, which asks whether a slide show runs.
 constexpr const char* kPhotoLibraryVersion = "8.0";
 
-constexpr std::uint32_t kHookClass = tarnscript::code("hook");
-constexpr std::uint32_t kRemoteSelect = tarnscript::code("RSel");
-
-// Results of HostSendEvent other than success.
-constexpr std::int32_t kNoSuchProcess = -600;
-constexpr std::int32_t kBadEvent = -50;
-constexpr std::int32_t kNotUnderstood = -1708;
+linux::host::Listener sListener;
 
 base::ApplicationInstance informationOf(const Instance& instance) {
   return {instance.serialNumber, programs::bundleIdentifier(instance.role),
@@ -39,6 +33,8 @@ const Instance* instanceOf(HostSessionID session, HostSerialNumberRef serialNumb
 }
 
 }  // namespace
+
+void linux::host::setListener(Listener listener) { sListener = std::move(listener); }
 
 std::uint32_t HostGetApplicationListSeed(HostSessionID session) {
   if (session != kHostDefaultSession) return 0;
@@ -71,26 +67,15 @@ HostDictionaryRef HostCopyApplicationInformation(HostSessionID session, HostSeri
 HostObject* HostCopyApplicationInformationItem(HostSessionID session, HostSerialNumberRef serialNumber,
                                                HostStringRef key) {
   const Instance* const instance = instanceOf(session, serialNumber);
-  return instance != nullptr ? base::copyInformationItem(informationOf(*instance), key) : nullptr;
+  if (instance == nullptr) return nullptr;
+  if (sListener.whoRuns) sListener.whoRuns(instance->role);
+  return base::copyInformationItem(informationOf(*instance), key);
 }
 
 HostSerialNumberRef HostCopyFrontApplication(HostSessionID session) {
   if (session != kHostDefaultSession) return nullptr;
   programs::takeInDesktop();
   const Instance* const front = programs::frontInstance();
+  if (sListener.whoIsInFront) sListener.whoIsInFront(front != nullptr ? front->role : Role::None);
   return front != nullptr ? HostSerialNumberRef(new base::SerialNumber(front->serialNumber)) : nullptr;
-}
-
-std::int32_t HostSendEvent(const HostEventDescriptor* event, HostEventDescriptor*, std::int32_t,
-                           std::int32_t) {
-  const auto target = base::targetOf(event);
-  if (!target) return kBadEvent;
-  const Instance* const instance = programs::findInstance(*target);
-  if (instance == nullptr) return kNoSuchProcess;
-  const auto* const contents = base::as<base::EventContents>(event->contents);
-  if (contents->eventClass != kHookClass || contents->eventID != kRemoteSelect) return kNotUnderstood;
-  // Of several in its role the core knows the one that was first when the list last changed.
-  const Instance* const first = programs::firstInstance(instance->role);
-  programs::bringToFront(first != nullptr ? *first : *instance);
-  return 0;
 }
