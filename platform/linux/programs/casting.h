@@ -2,6 +2,7 @@
 // programs, and the categories of its desktop entry, in this order.
 #pragma once
 
+#include <cstdint>
 #include <string>
 #include <string_view>
 
@@ -10,8 +11,20 @@
 
 namespace linux::programs {
 
+/// What a casting rests on.
+enum class Ground : std::uint8_t {
+  Unknown,       ///< neither its entry nor the table says anything
+  Bystander,     ///< a proxy for other players or a headset; a browser's window
+  OwnWord,       ///< X-Kvd-Application in its entry
+  BusName,       ///< the table, by its bus name
+  DesktopEntry,  ///< the table, by its desktop entry
+  WindowClass,   ///< the table, by the class of its window
+  Categories,    ///< those of its entry
+};
+
 struct Casting {
   Role role = Role::None;
+  Ground ground = Ground::Unknown;
   /// Null for a program that is not in the table.
   const Program* program = nullptr;
   /// The person or packager has written the role into the desktop entry.

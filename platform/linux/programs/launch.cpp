@@ -41,21 +41,6 @@ bool canBeStarted(const Entry& entry) {
   return (!browser || entry.cast) && (entry.busActivatable || !entry.command.empty());
 }
 
-const Entry* defaultEntry(Role role) {
-  if (role == Role::Jukebox) {
-    const Entry* const chosen = entryByID(defaultMusicPlayer());
-    if (chosen != nullptr && canBeStarted(*chosen)) return chosen;
-  }
-  for (const Program& program : programs()) {
-    const Entry* const entry = program.role == role ? installed(program) : nullptr;
-    if (entry != nullptr && canBeStarted(*entry)) return entry;
-  }
-  const auto& all = entries();
-  const auto any = std::find_if(
-      all.begin(), all.end(), [&](const Entry& entry) { return entry.role == role && canBeStarted(entry); });
-  return any != all.end() ? &*any : nullptr;
-}
-
 /// "/org/example/Player" for "org.example.Player" (Desktop Entry Specification, D-Bus Activation).
 std::string objectPath(const std::string& id) {
   std::string path = "/" + id;
@@ -176,11 +161,26 @@ void startDetached(const Entry& entry) {
 
 }  // namespace
 
+const Entry* defaultProgramOf(Role role) {
+  if (role == Role::Jukebox) {
+    const Entry* const chosen = entryByID(defaultMusicPlayer());
+    if (chosen != nullptr && canBeStarted(*chosen)) return chosen;
+  }
+  for (const Program& program : programs()) {
+    const Entry* const entry = program.role == role ? installed(program) : nullptr;
+    if (entry != nullptr && canBeStarted(*entry)) return entry;
+  }
+  const auto& all = entries();
+  const auto any = std::find_if(
+      all.begin(), all.end(), [&](const Entry& entry) { return entry.role == role && canBeStarted(entry); });
+  return any != all.end() ? &*any : nullptr;
+}
+
 void launchProgramOf(Role role) {
   static std::map<Role, base::Deadline> sStarting;
   const auto starting = sStarting.find(role);
   if (starting != sStarting.end() && !starting->second.hasPassed()) return;
-  const Entry* const entry = defaultEntry(role);
+  const Entry* const entry = defaultProgramOf(role);
   if (entry == nullptr) return;
   sStarting.insert_or_assign(role, base::Deadline(kStartingLimit));
   if (startOverBus(*entry) || entry->command.empty() || startAsUnit(*entry)) return;

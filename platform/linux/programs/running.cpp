@@ -11,7 +11,6 @@
 
 #include "platform/base/run_loop.h"
 #include "platform/linux/players/mpris.h"
-#include "platform/linux/programs/casting.h"
 #include "platform/linux/system/process.h"
 #include "platform/tarnscript/tarnscript.h"
 #include "platform/text/case.h"
@@ -54,6 +53,7 @@ Instance instanceOf(Casting casting) {
   Instance instance;
   instance.role = casting.role;
   instance.program = casting.program;
+  instance.ground = casting.ground;
   instance.entry = std::move(casting.entry);
   return instance;
 }

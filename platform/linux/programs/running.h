@@ -10,6 +10,7 @@
 
 #include "platform/host.h"
 #include "platform/linux/players/players.h"
+#include "platform/linux/programs/casting.h"
 #include "platform/linux/programs/table.h"
 #include "platform/linux/windows/windows.h"
 
@@ -20,6 +21,7 @@ struct Instance {
   Role role = Role::None;
   /// Null for a program that is not in the table: it was cast by its desktop entry.
   const Program* program = nullptr;
+  Ground ground = Ground::Unknown;
   /// Its desktop entry without ".desktop"; empty where it is unknown.
   std::string entry;
   pid_t process = 0;

@@ -165,6 +165,24 @@ pa_cvolume scaled(const Sink& sink, pa_volume_t loudest) {
 
 void finish() { sContext.reset(); }
 
+std::string serverName() {
+  struct Told {
+    Result* result = nullptr;
+    std::string name;
+  } told;
+  const Operation ask = [&](pa_context* context, Result& result) {
+    told.result = &result;
+    const auto note = [](pa_context*, const pa_server_info* info, void* data) {
+      auto& taker = *static_cast<Told*>(data);
+      if (info != nullptr) taker.name = info->server_name;
+      *taker.result = Result::Done;
+    };
+    return pa_context_get_server_info(context, note, &told);
+  };
+  run(ask, Deadline(system::kQueryLimit));
+  return told.name;
+}
+
 std::optional<SoundState> soundState() {
   const auto sink = defaultSink(Deadline(system::kQueryLimit));
   if (!sink) return std::nullopt;

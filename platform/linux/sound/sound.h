@@ -6,6 +6,7 @@
 #pragma once
 
 #include <optional>
+#include <string>
 
 namespace linux::sound {
 
@@ -17,6 +18,9 @@ struct SoundState {
 
 /// Closes the connection; a later question makes a new one.
 void finish();
+
+/// What the sound server calls itself; empty without one.
+std::string serverName();
 
 /// The default sink's; nothing without a server, without a sink, or when no answer comes in time.
 std::optional<SoundState> soundState();

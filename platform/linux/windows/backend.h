@@ -3,6 +3,7 @@
 
 #include <cstdint>
 #include <span>
+#include <string>
 #include <vector>
 
 #include "platform/linux/windows/window.h"
@@ -23,6 +24,10 @@ using Modifiers = std::uint8_t;
 /// A back end. None of its functions waits longer than a question may take; a window that has gone is as good
 /// as one that does nothing. What a back end lacks it takes from kNone (none.h).
 struct Backend {
+  /// What it asks, for people.
+  const char* name = "";
+  /// Why it is not open, or what it cannot tell, in a few words; empty where nothing is missing.
+  std::string (*obstacle)() = [] { return std::string(); };
   /// Called before all others; null where nothing is to be prepared.
   void (*init)() = nullptr;
   /// Makes the connection, where there is none, at most once a turn of the run loop. Whether there is one.
@@ -38,6 +43,7 @@ struct Backend {
   void (*look)(std::span<Window> windows);
   /// Whether it can tell which window is active.
   bool (*knowsFront)();
+  /// The same for who only looks as for who types.
   Reach (*reach)();
   /// Asks for the window to come to the front.
   void (*activate)(std::uint64_t window);

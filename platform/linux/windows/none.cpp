@@ -12,6 +12,8 @@ const std::vector<Window>& noWindows() {
 }  // namespace
 
 const Backend kNone{
+    .name = "none",
+    .obstacle = [] { return std::string(); },
     .open = [] { return false; },
     .close = [] {},
     .takeIn = [] { return false; },

@@ -2,9 +2,8 @@
 
 #include <cstdint>
 #include <cstdlib>
-#include <optional>
-#include <string>
 #include <string_view>
+#include <vector>
 
 #include "platform/base/run_loop.h"
 #include "platform/linux/system/bus.h"
@@ -33,27 +32,31 @@ bool take(std::string_view assignment) {
   return false;
 }
 
-bool askServiceManager() {
+}  // namespace
+
+std::optional<std::vector<std::string>> serviceManagerEnvironment() {
   const system::Message answer =
       system::call({"org.freedesktop.systemd1", 0},
                    {"/org/freedesktop/systemd1", "org.freedesktop.DBus.Properties", "Get"},
                    system::kQueryLimit, "ss", "org.freedesktop.systemd1.Manager", "Environment");
   if (answer == nullptr || sd_bus_message_enter_container(answer.get(), 'v', "as") <= 0 ||
       sd_bus_message_enter_container(answer.get(), 'a', "s") <= 0) {
-    return false;
+    return std::nullopt;
   }
-  bool changed = false;
+  std::vector<std::string> environment;
   const char* assignment = nullptr;
-  while (sd_bus_message_read(answer.get(), "s", &assignment) > 0) changed |= take(assignment);
-  return changed;
+  while (sd_bus_message_read(answer.get(), "s", &assignment) > 0) environment.emplace_back(assignment);
+  return environment;
 }
-
-}  // namespace
 
 bool takeSessionEnvironment() {
   if (sAsked == base::turn()) return sChanged;
   sAsked = base::turn();
-  return sChanged = askServiceManager();
+  sChanged = false;
+  const auto environment = serviceManagerEnvironment();
+  if (!environment) return false;
+  for (const std::string& assignment : *environment) sChanged |= take(assignment);
+  return sChanged;
 }
 
 }  // namespace linux::windows

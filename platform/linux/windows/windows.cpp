@@ -157,6 +157,8 @@ void finish() {
   merge();
 }
 
+std::span<const Backend* const> backends() { return sBackends; }
+
 bool keysAreWanted() { return sUse == Use::Typing; }
 
 bool isOpen() {
@@ -206,6 +208,11 @@ bool sendKey(ID window, std::uint32_t keysym, bool down, Modifiers modifiers) {
   const auto index = indexOf(window);
   const ID reached = index ? reachable(sWindows[*index], sIDs[*index], down) : window;
   return reached && reached.backend->sendKey(reached.number, keysym, down, modifiers);
+}
+
+bool takesKeys(ID window) {
+  const auto index = indexOf(window);
+  return index && reachable(sWindows[*index], sIDs[*index], true);
 }
 
 std::vector<Output> outputs() {

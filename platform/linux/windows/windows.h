@@ -20,6 +20,8 @@ enum class Use : std::uint8_t { Looking, Typing };
 void init(std::vector<const Backend*> backends, Use use = Use::Typing);
 /// Closes them.
 void finish();
+/// Those of init, in their order.
+std::span<const Backend* const> backends();
 
 /// Whether any back end is open.
 bool isOpen();
@@ -45,6 +47,9 @@ void activate(ID window);
 /// Sends a press or release of a key, an X keysym, to one window and to nothing else. False when it cannot be
 /// reached, is gone, or the keyboard has no such key.
 bool sendKey(ID window, std::uint32_t keysym, bool down, Modifiers modifiers);
+
+/// Whether sendKey would reach the window now.
+bool takesKeys(ID window);
 
 /// The active outputs of all back ends.
 std::vector<Output> outputs();

@@ -183,6 +183,11 @@ wl_display* connection() {
   return sDisplay;
 }
 
+std::string obstacle() {
+  const std::string path = displayPath();
+  return path.empty() ? "WAYLAND_DISPLAY is not set" : "no compositor lets us in at " + path;
+}
+
 void disconnect() { loseConnection(); }
 
 pid_t compositor() { return sCompositor; }

@@ -8,6 +8,7 @@
 
 #include <cstdint>
 #include <span>
+#include <string>
 
 struct wl_display;
 struct wl_interface;
@@ -54,6 +55,9 @@ bool nobodySpeaks();
 /// The connection, with what has come taken in; made anew where it was lost (at most once a turn of the run
 /// loop). Null while there is none. Borrowed, until the next call.
 wl_display* connection();
+
+/// Why there is none, in a few words.
+std::string obstacle();
 
 /// Closes it. Questions that come later open it again.
 void disconnect();

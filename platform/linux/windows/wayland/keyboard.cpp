@@ -42,8 +42,10 @@ void dropKeyboards() {
   sManager = nullptr;
 }
 
+bool keyboardsAreMade() { return sManager != nullptr && seat() != nullptr; }
+
 void plugInKeyboard() {
-  if (sManager == nullptr || seat() == nullptr) return;
+  if (!keyboardsAreMade()) return;
   Keymap keymap = makeKeymap();
   // xkb's text ends with a NUL on the wire.
   const std::size_t size = keymap.text.size() + 1;

@@ -17,6 +17,8 @@ void plugInKeyboard();
 /// Pulls it out, which releases its keys.
 void pullOutKeyboard();
 bool hasKeyboard();
+/// Whether one could be plugged in.
+bool keyboardsAreMade();
 
 /// Presses or releases a key; what comes of it is on its way with the connection's next flush. False when it
 /// has no such key, and for the release of one that is not down.

@@ -1,6 +1,7 @@
 #include "platform/linux/windows/wlr/wlr.h"
 
 #include <optional>
+#include <string>
 
 #include "foreign_toplevel.h"
 #include "platform/linux/windows/wayland/connection.h"
@@ -32,6 +33,15 @@ void begin() {
 const wayland::Part kPart{.interests = kInterests, .isTold = hasManager, .begin = begin, .end = dropManager};
 
 bool isConnected() { return wayland::connection() != nullptr && wayland::speaks(kPart); }
+
+/// Who only looks has none plugged in.
+bool typesIntoFront() { return keysAreWanted() ? wayland::hasKeyboard() : wayland::keyboardsAreMade(); }
+
+std::string obstacle() {
+  if (isConnected()) return typesIntoFront() ? "" : "it makes no keyboards (zwp_virtual_keyboard_manager_v1)";
+  if (wayland::connection() == nullptr) return wayland::obstacle();
+  return hasManager() ? "it is asked in another way" : "it does not offer zwlr_foreign_toplevel_manager_v1";
+}
 
 bool takeIn() {
   isConnected();
@@ -69,6 +79,8 @@ void bringToFront(std::uint64_t window) {
 }  // namespace
 
 const Backend kBackend{
+    .name = "wlroots and its like",
+    .obstacle = obstacle,
     .init = [] { wayland::join(kPart); },
     .open = isConnected,
     .close = wayland::disconnect,
@@ -76,7 +88,7 @@ const Backend kBackend{
     .list = []() -> const std::vector<Window>& { return sWindows; },
     .look = look,
     .knowsFront = isConnected,
-    .reach = [] { return isConnected() && wayland::hasKeyboard() ? Reach::FocusedWindow : Reach::Nobody; },
+    .reach = [] { return isConnected() && typesIntoFront() ? Reach::FocusedWindow : Reach::Nobody; },
     .activate = bringToFront,
     .sendKey = wayland::sendKey,
     .outputs = [] { return isConnected() ? wayland::outputs() : std::vector<Output>(); },

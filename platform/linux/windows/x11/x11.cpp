@@ -1,5 +1,8 @@
 #include "platform/linux/windows/x11/x11.h"
 
+#include <cstdlib>
+#include <string>
+
 #include "platform/linux/windows/x11/clients.h"
 #include "platform/linux/windows/x11/connection.h"
 #include "platform/linux/windows/x11/keys.h"
@@ -11,9 +14,18 @@ namespace {
 
 bool isConnected() { return connection() != nullptr; }
 
+std::string obstacle() {
+  if (isConnected()) return {};
+  const char* const display = std::getenv("DISPLAY");
+  if (display == nullptr) return "DISPLAY is not set";
+  return std::string("no X server lets us in at ") + display;
+}
+
 }  // namespace
 
 const Backend kBackend{
+    .name = "X server",
+    .obstacle = obstacle,
     .open = isConnected,
     .close = disconnect,
     .takeIn = takeInClients,
