@@ -10,10 +10,6 @@ constexpr std::int32_t kParameterError = -50;
 
 }  // namespace
 
-std::int32_t HostClearEventRecord(void* record, std::uint32_t length) {
-  return base::clearEventRecord(record, length) ? 0 : kParameterError;
-}
-
 std::int32_t HostPostEventRecord(HostConnectionID connection, const void* record, std::uint32_t length,
                                  std::int32_t) {
   if (connection == 0 || record == nullptr || !base::isEventRecordLength(length)) return kParameterError;

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <vector>
 
+#include "platform/base/event_record.h"
 #include "platform/base/values.h"
 #include "platform/host.h"
 #include "platform/linux/programs/running.h"
@@ -16,6 +17,7 @@ namespace windows = linux::windows;
 
 constexpr HostConnectionID kConnection = 1;
 constexpr std::int32_t kFailed = -1;
+constexpr std::int32_t kParameterError = -50;
 
 }  // namespace
 
@@ -26,6 +28,10 @@ HostConnectionID HostConnectWindowServer() {
 std::int32_t HostSetLocalEventsSuppressionInterval(HostConnectionID connection, double) {
   // A key for one window never holds back the person's own.
   return connection == kConnection ? 0 : kFailed;
+}
+
+std::int32_t HostClearEventRecord(void* record, std::uint32_t length) {
+  return base::clearEventRecord(record, length) ? 0 : kParameterError;
 }
 
 std::int32_t HostFindProcessByBundleIdentifier(HostStringRef bundleIdentifier, std::uint32_t,

@@ -1,0 +1,86 @@
+#include "report/deeds.h"
+
+#include <utility>
+
+#include "platform/linux/programs/launch.h"
+#include "platform/linux/programs/own_words.h"
+#include "platform/linux/windows/keystrokes.h"
+#include "report/names.h"
+
+namespace report {
+
+namespace {
+
+using linux::programs::Action;
+using linux::programs::Instance;
+using linux::programs::Means;
+using linux::programs::Role;
+
+std::vector<Deed> sDeeds;
+
+/// A key, and why it would be lost.
+std::string keyWay(const Instance& instance, const std::string& key) {
+  const auto windows = linux::windows::look(instance.windows);
+  const auto* const window = linux::windows::keyboardWindow(windows);
+  if (window == nullptr) return "key " + key + " (lost: it has no window)";
+  if (linux::windows::takesKeys(window->id)) return "key " + key;
+  return "key " + key + (window->isActive ? " (lost: none reaches it)" : " (lost: it is not in front)");
+}
+
+std::string wayOf(const Action& action, const Instance& instance) {
+  const std::string how = action.how;
+  switch (action.means) {
+    case Means::Mpris:
+      return "MPRIS2 " + how;
+    case Means::Channel:
+      return "its channel, " + how;
+    case Means::Action:
+      return "its action " + how;
+    case Means::Method:
+      return "its method " + how.substr(how.rfind(' ') + 1);
+    case Means::Key:
+      return keyWay(instance, how);
+    case Means::Nothing:
+      break;
+  }
+  return "nothing to do";
+}
+
+std::vector<std::string> waysOf(const Instance& instance, tarnscript::Code word) {
+  std::vector<std::string> ways;
+  if (word == 0) return ways;
+  for (const Action& action : linux::programs::actionsFor(instance.role, instance.program, word)) {
+    ways.push_back(wayOf(action, instance));
+  }
+  return ways;
+}
+
+void noteWith(const Instance& instance, std::string words, std::vector<std::string> ways) {
+  sDeeds.push_back({instance.role, nameOf(instance), instance.process, std::move(words), std::move(ways)});
+}
+
+}  // namespace
+
+void note(Deed deed) { sDeeds.push_back(std::move(deed)); }
+
+void noteFor(const Instance& instance, std::string words, tarnscript::Code word) {
+  noteWith(instance, std::move(words), waysOf(instance, word));
+}
+
+void noteKey(const Instance& instance, std::uint16_t virtualKey, bool withShift) {
+  const std::string key = keyName(virtualKey, withShift);
+  auto ways = waysOf(instance, linux::programs::words::wordForKey(virtualKey, withShift));
+  if (ways.empty()) ways.push_back(keyWay(instance, key));
+  noteWith(instance, "key " + key, std::move(ways));
+}
+
+void noteStart(Role role) {
+  const auto* const entry = linux::programs::defaultProgramOf(role);
+  const std::string kind(wordsFor(role));
+  if (entry == nullptr) return note({role, "nobody", 0, "no " + kind + " is installed to be started", {}});
+  note({role, entry->id, 0, "start", {}});
+}
+
+std::vector<Deed> takeDeeds() { return std::exchange(sDeeds, {}); }
+
+}  // namespace report
