@@ -4,7 +4,7 @@
 
 #include "platform/linux/programs/launch.h"
 #include "platform/linux/programs/own_words.h"
-#include "platform/linux/windows/keystrokes.h"
+#include "platform/linux/roles/performer.h"
 #include "report/names.h"
 
 namespace report {
@@ -15,31 +15,36 @@ using linux::programs::Action;
 using linux::programs::Instance;
 using linux::programs::Means;
 using linux::programs::Role;
+using linux::roles::Performer;
 
 std::vector<Deed> sDeeds;
 
 /// A key, and why it would be lost.
-std::string keyWay(const Instance& instance, const std::string& key) {
-  const auto windows = linux::windows::look(instance.windows);
-  const auto* const window = linux::windows::keyboardWindow(windows);
+std::string keyWay(const Performer& performer, const std::string& key) {
+  const auto* const window = performer.keyboardWindow();
   if (window == nullptr) return "key " + key + " (lost: it has no window)";
   if (linux::windows::takesKeys(window->id)) return "key " + key;
   return "key " + key + (window->isActive ? " (lost: none reaches it)" : " (lost: it is not in front)");
 }
 
-std::string wayOf(const Action& action, const Instance& instance) {
+bool offersActions(const Performer& performer) {
+  const auto* const window = performer.keyboardWindow();
+  return window != nullptr && !window->gtk.busName.empty();
+}
+
+std::string wayOf(const Action& action, const Performer& performer) {
   const std::string how = action.how;
   switch (action.means) {
     case Means::Mpris:
-      return "MPRIS2 " + how;
+      return "MPRIS2 " + how + (performer.playerIfAny() != nullptr ? "" : " (it is not on the bus)");
     case Means::Channel:
-      return "its channel, " + how;
+      return "its channel, " + how + (performer.channel() != nullptr ? "" : " (not open)");
     case Means::Action:
-      return "its action " + how;
+      return "its action " + how + (offersActions(performer) ? "" : " (it shows none)");
     case Means::Method:
       return "its method " + how.substr(how.rfind(' ') + 1);
     case Means::Key:
-      return keyWay(instance, how);
+      return keyWay(performer, how);
     case Means::Nothing:
       break;
   }
@@ -49,8 +54,9 @@ std::string wayOf(const Action& action, const Instance& instance) {
 std::vector<std::string> waysOf(const Instance& instance, tarnscript::Code word) {
   std::vector<std::string> ways;
   if (word == 0) return ways;
+  const Performer performer(instance);
   for (const Action& action : linux::programs::actionsFor(instance.role, instance.program, word)) {
-    ways.push_back(wayOf(action, instance));
+    ways.push_back(wayOf(action, performer));
   }
   return ways;
 }
@@ -70,15 +76,15 @@ void noteFor(const Instance& instance, std::string words, tarnscript::Code word)
 void noteKey(const Instance& instance, std::uint16_t virtualKey, bool withShift) {
   const std::string key = keyName(virtualKey, withShift);
   auto ways = waysOf(instance, linux::programs::words::wordForKey(virtualKey, withShift));
-  if (ways.empty()) ways.push_back(keyWay(instance, key));
-  noteWith(instance, "key " + key, std::move(ways));
+  noteWith(instance, ways.empty() ? keyWay(Performer(instance), key) : "key " + key, std::move(ways));
 }
 
 void noteStart(Role role) {
   const auto* const entry = linux::programs::defaultProgramOf(role);
   const std::string kind(wordsFor(role));
   if (entry == nullptr) return note({role, "nobody", 0, "no " + kind + " is installed to be started", {}});
-  note({role, entry->id, 0, "start", {}});
+  const auto* const known = linux::programs::programByEntry(entry->id);
+  note({role, known != nullptr ? known->name : entry->id, 0, "start", {}});
 }
 
 std::vector<Deed> takeDeeds() { return std::exchange(sDeeds, {}); }

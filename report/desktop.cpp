@@ -9,6 +9,7 @@
 #include "platform/base/failure.h"
 #include "platform/linux/players/mpris.h"
 #include "platform/linux/programs/casting.h"
+#include "platform/linux/programs/own_remote.h"
 #include "platform/linux/programs/running.h"
 #include "platform/linux/sound/sound.h"
 #include "platform/linux/system/bus.h"
@@ -94,10 +95,8 @@ std::string whyNone(const programs::Casting& casting, bool isPlayer) {
       return isPlayer ? "it speaks for others" : "a browser, which counts while it has something to play";
     case Ground::OwnWord:
       return "X-Kvd-Application in its desktop entry says so";
-    case Ground::Categories:
-      return "neither the table of programs nor the categories of " + casting.entry + ".desktop give it one";
     case Ground::Unknown:
-      return "it is not in the table of programs, and no desktop entry of a player was found for it";
+      return "neither the table of programs nor a desktop entry gives it one";
     default:
       return isPlayer ? "it has nothing to play, or speaks for a browser that speaks for itself"
                       : "it shows a document of another kind, or its program is counted by another window";
@@ -180,6 +179,7 @@ Object describeOthers() {
     const auto casting = programs::castPlayer(player.desktopEntry, player.name);
     list.push_back({{"kind", "player"},
                     {"name", player.name},
+                    {"class", ""},
                     {"process", player.callee.process},
                     {"why", whyNone(casting, true)}});
   }
@@ -247,6 +247,8 @@ Object describeDesktop() {
   object["window_systems"] = describeBackends();
   programs::takeInDesktop();
   object["front"] = describeFront();
+  const std::string taker = programs::takerOfRemote();
+  object["has_remote"] = taker.empty() ? "kvd" : taker;
   object["programs"] = describePrograms();
   object["others"] = describeOthers();
   object["outputs"] = describeOutputs();

@@ -36,6 +36,9 @@ std::string pressed(const base::SoundKey& key) {
   if (!sound) return "sound key, but no sound server answers";
   std::string words = "output volume from " + std::to_string(sound->volume) + " to " +
                       std::to_string(linux::sound::volumeAfter(key, sound->volume));
+  if (linux::sound::volumeAfter(key, sound->volume) == sound->volume) {
+    words = "output volume stays at " + std::to_string(sound->volume);
+  }
   return key.louder && sound->muted ? words + ", no longer muted" : words;
 }
 

@@ -6,8 +6,7 @@
 #include <string>
 
 #include "platform/linux/host/host.h"
-#include "platform/linux/windows/wlr/wlr.h"
-#include "platform/linux/windows/x11/x11.h"
+#include "platform/linux/windows/every_backend.h"
 #include "report/arguments.h"
 #include "report/button.h"
 #include "report/desktop.h"
@@ -33,7 +32,7 @@ Exit status: 0, 1 when the report could not be written, 2 for a bad command line
 
 std::string reportOn(const report::Arguments& arguments) {
   report::Object object;
-  linux::host::init({&linux::windows::wlr::kBackend, &linux::windows::x11::kBackend});
+  linux::host::init(linux::windows::everyBackend(), linux::windows::Use::Looking);
   if (arguments.button != nullptr) {
     object = report::describeButton(*arguments.button);
   } else {

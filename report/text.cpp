@@ -130,8 +130,10 @@ std::string windowSystemsText(const Object& systems) {
   return text;
 }
 
-std::string frontText(const Object& front, const Object& systems) {
-  std::string text = title("In front");
+std::string frontText(const Object& front, const Object& systems, const Object& taker) {
+  const bool isKvd = taker == "kvd";
+  std::string text =
+      title("In front") + row("has the remote", isKvd ? "kvd" : plain(taker) + ", which reads it itself");
   const bool told =
       std::ranges::any_of(systems, [](const Object& each) { return each["tells_front"] == true; });
   if (!told) return text + row("window", "nobody tells which one is in front");
@@ -237,11 +239,12 @@ std::string deedsText(const Object& deeds) {
 }  // namespace
 
 std::string desktopText(const Object& desktop) {
-  std::string text =
-      "kvd " + plain(desktop["version"]) + "\n" + sessionText(desktop["session"]) +
-      windowSystemsText(desktop["window_systems"]) + frontText(desktop["front"], desktop["window_systems"]) +
-      programsText(desktop["programs"]) + othersText(desktop["others"]) + outputsText(desktop["outputs"]) +
-      soundText(desktop["sound"]) + serviceText(desktop["service"]);
+  std::string text = "kvd " + plain(desktop["version"]) + "\n" + sessionText(desktop["session"]) +
+                     windowSystemsText(desktop["window_systems"]) +
+                     frontText(desktop["front"], desktop["window_systems"], desktop["has_remote"]) +
+                     programsText(desktop["programs"]) + othersText(desktop["others"]) +
+                     outputsText(desktop["outputs"]) + soundText(desktop["sound"]) +
+                     serviceText(desktop["service"]);
   return desktop.contains("remotes") ? text + remotesText(desktop["remotes"]) : text;
 }
 

@@ -6,14 +6,13 @@
 #include "platform/linux/roles/world.h"
 #include "platform/linux/sound/sound.h"
 #include "platform/linux/system/bus.h"
-#include "platform/linux/windows/windows.h"
 #include "platform/scripting/script.h"
 
 namespace linux::host {
 
-void init(std::vector<const windows::Backend*> backends) {
+void init(std::vector<const windows::Backend*> backends, windows::Use use) {
   base::bootstrapIsThere = [] { return system::bus() != nullptr; };
-  windows::init(std::move(backends));
+  windows::init(std::move(backends), use);
   scripting::setHooks({.world = &roles::world(), .started = nullptr, .ended = nullptr});
 }
 

@@ -3,13 +3,13 @@
 
 #include <vector>
 
-#include "platform/linux/windows/backend.h"
+#include "platform/linux/windows/windows.h"
 
 namespace linux::host {
 
 /// Puts the host together: what a start needs, the windows by these back ends, what scripts can name.
 /// Connections are made when they are first needed.
-void init(std::vector<const windows::Backend*> backends);
+void init(std::vector<const windows::Backend*> backends, windows::Use use = windows::Use::Typing);
 
 /// Closes what was opened since. What was sent gets through.
 void finish();
