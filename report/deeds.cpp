@@ -40,7 +40,7 @@ std::string wayOf(const Action& action, const Performer& performer) {
     case Means::Channel:
       return "its channel, " + how + (performer.channel() != nullptr ? "" : " (not open)");
     case Means::Action:
-      return "its action " + how + (offersActions(performer) ? "" : " (it shows none)");
+      return "its action " + how + (offersActions(performer) ? "" : " (not offered)");
     case Means::Method:
       return "its method " + how.substr(how.rfind(' ') + 1);
     case Means::Key:

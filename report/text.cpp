@@ -216,7 +216,12 @@ std::string serviceText(const Object& service) {
 std::string remotesText(const Object& remotes) {
   std::string text = title("Remotes");
   if (remotes.is_null()) return text + row("kvd-receiver", "is not installed beside kvd-report");
-  for (const Object& line : remotes) text += std::string(kIndent, ' ') + plain(line, 500) + "\n";
+  for (const Object& each : remotes) {
+    const std::string line = plain(each, 500);
+    // What is there to be copied stays whole.
+    const bool isRule = line.find("==") != std::string::npos;
+    text += std::string(kIndent, ' ') + (isRule ? line + "\n" : wrapped(line, kIndent, 2 * kIndent));
+  }
   return text;
 }
 

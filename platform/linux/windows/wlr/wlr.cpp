@@ -79,7 +79,7 @@ void bringToFront(std::uint64_t window) {
 }  // namespace
 
 const Backend kBackend{
-    .name = "wlroots and its like",
+    .name = "Wayland (wlr)",
     .obstacle = obstacle,
     .init = [] { wayland::join(kPart); },
     .open = isConnected,
