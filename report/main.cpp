@@ -1,5 +1,10 @@
 // kvd-report: what kvd sees at this moment, and what it would do with a button.
 
+#include <sys/ioctl.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <cstddef>
 #include <cstdio>
 #include <exception>
 #include <span>
@@ -30,6 +35,13 @@ which role and why, what they play, outputs, sound, the service, the remotes.
 Exit status: 0, 1 when the report could not be written, 2 for a bad command line.
 )";
 
+/// Not wider than is good to read, nor narrower than the longest labels take.
+void fitTerminal() {
+  winsize size{};
+  if (ioctl(STDOUT_FILENO, TIOCGWINSZ, &size) != 0 || size.ws_col == 0) return;
+  report::setColumns(std::clamp<std::size_t>(size.ws_col, 60, 100));
+}
+
 std::string reportOn(const report::Arguments& arguments) {
   report::Object object;
   linux::host::init(linux::windows::everyBackend(), linux::windows::Use::Looking);
@@ -41,6 +53,7 @@ std::string reportOn(const report::Arguments& arguments) {
   }
   linux::host::finish();
   // Titles are whatever their programs have written.
+  fitTerminal();
   if (arguments.json) return object.dump(2, ' ', false, report::Object::error_handler_t::replace) + "\n";
   return arguments.button != nullptr ? report::buttonText(object) : report::desktopText(object);
 }

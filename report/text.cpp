@@ -12,7 +12,9 @@ namespace report {
 
 namespace {
 
-constexpr std::size_t kColumns = 100;
+std::size_t sColumns = 100;
+/// What programs have written is cut there.
+constexpr std::size_t kLongestText = 500;
 /// What titles may take of a line.
 constexpr std::size_t kLongestTitle = 40;
 constexpr std::size_t kIndent = 2;
@@ -20,7 +22,7 @@ constexpr std::size_t kIndent = 2;
 constexpr std::size_t kLabel = 22;
 
 /// What others have written, without what a terminal would obey, and not longer than this.
-std::string plain(std::string_view text, std::size_t most = kColumns) {
+std::string plain(std::string_view text, std::size_t most = kLongestText) {
   std::string result;
   std::size_t count = 0;
   while (!text.empty() && count < most) {
@@ -33,7 +35,7 @@ std::string plain(std::string_view text, std::size_t most = kColumns) {
   return text.empty() ? result : result + "…";
 }
 
-std::string plain(const Object& text, std::size_t most = kColumns) {
+std::string plain(const Object& text, std::size_t most = kLongestText) {
   return text.is_string() ? plain(text.get<std::string_view>(), most) : text.dump();
 }
 
@@ -49,7 +51,7 @@ std::string wrapped(const std::string& text, std::size_t first, std::size_t inde
     const std::size_t end = std::min(text.find(' ', at), text.size());
     const std::string word = text.substr(at, end - at);
     const std::size_t width = text::characterCount(word);
-    if (at > 0 && column + 1 + width > kColumns) {
+    if (at > 0 && column + 1 + width > sColumns) {
       result += "\n" + std::string(indent, ' ');
       column = indent;
     } else if (at > 0) {
@@ -96,7 +98,7 @@ std::string time(double seconds) {
 
 std::string sessionText(const Object& session) {
   std::string text = title("Session");
-  if (!session["bus"]) text += row("session bus", plain(session["obstacle"], 500));
+  if (!session["bus"]) text += row("session bus", plain(session["obstacle"]));
   const Object& here = session["here"];
   const Object& there = session["service_manager"];
   std::vector<std::string> names;
@@ -123,7 +125,7 @@ std::string sessionText(const Object& session) {
 std::string windowSystemsText(const Object& systems) {
   std::string text = title("Window systems");
   for (const Object& system : systems) {
-    const std::string obstacle = plain(system["obstacle"], 500);
+    const std::string obstacle = plain(system["obstacle"]);
     const std::string state = system["open"] ? "open" : "not open";
     text += row(plain(system["name"]), obstacle.empty() ? state : state + ": " + obstacle);
   }
@@ -172,7 +174,7 @@ std::string othersText(const Object& others) {
     const bool isPlayer = each["kind"] == "player";
     std::string what = isPlayer ? plain(each["name"], kLongestTitle) : quoted(each["name"]);
     if (!isPlayer) what += ", of class " + plain(each["class"], kLongestTitle);
-    text += row(plain(each["kind"]), what + ": " + plain(each["why"], 500));
+    text += row(plain(each["kind"]), what + ": " + plain(each["why"]));
   }
   return text;
 }
@@ -197,7 +199,7 @@ std::string soundText(const Object& sound) {
 
 std::string serviceText(const Object& service) {
   std::string text = title("Service");
-  if (service["socket"].is_null()) return text + row("socket", plain(service["obstacle"], 500));
+  if (service["socket"].is_null()) return text + row("socket", plain(service["obstacle"]));
   text += row("socket", plain(service["socket"]));
   const auto isCalled = [](const char* name) {
     return [name](const Object& each) { return each["name"] == name; };
@@ -217,7 +219,7 @@ std::string remotesText(const Object& remotes) {
   std::string text = title("Remotes");
   if (remotes.is_null()) return text + row("kvd-receiver", "is not installed beside kvd-report");
   for (const Object& each : remotes) {
-    const std::string line = plain(each, 500);
+    const std::string line = plain(each);
     // What is there to be copied stays whole.
     const bool isRule = line.find("==") != std::string::npos;
     text += std::string(kIndent, ' ') + (isRule ? line + "\n" : wrapped(line, kIndent, 2 * kIndent));
@@ -230,10 +232,10 @@ std::string remotesText(const Object& remotes) {
 std::string deedsText(const Object& deeds) {
   std::string text;
   for (const Object& deed : deeds) {
-    std::string words = plain(deed["words"], 500);
+    std::string words = plain(deed["words"]);
     const char* separator = ": by ";
     for (const Object& way : deed["ways"]) {
-      words += separator + plain(way, 500);
+      words += separator + plain(way);
       separator = ", else by ";
     }
     text += row(program(deed), words);
@@ -242,6 +244,8 @@ std::string deedsText(const Object& deeds) {
 }
 
 }  // namespace
+
+void setColumns(std::size_t columns) { sColumns = columns; }
 
 std::string desktopText(const Object& desktop) {
   std::string text = "kvd " + plain(desktop["version"]) + "\n" + sessionText(desktop["session"]) +
@@ -255,7 +259,7 @@ std::string desktopText(const Object& desktop) {
 
 std::string buttonText(const Object& button) {
   std::string text = "What the button " + plain(button["button"]) + " would do now\n\n";
-  const std::string why = plain(button["why"], 500);
+  const std::string why = plain(button["why"]);
   if (!button.contains("told")) return text + row("goes to", "nobody: " + why);
   const Object& target = button["target"];
   if (!target.is_null()) {
@@ -270,7 +274,7 @@ std::string buttonText(const Object& button) {
   if (button["told"].empty()) text += row("nobody", "nothing is done");
   if (!button["released"].empty()) text += title("Told when it is released") + deedsText(button["released"]);
   if (button["repeats"]) text += title("Held down it is repeated.");
-  for (const Object& remark : button["remarks"]) text += "\n" + wrapped(plain(remark, 500), 0, 0);
+  for (const Object& remark : button["remarks"]) text += "\n" + wrapped(plain(remark), 0, 0);
   return text;
 }
 

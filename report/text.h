@@ -1,14 +1,17 @@
 // A report as people read it.
 #pragma once
 
+#include <cstddef>
 #include <string>
 
 #include "report/object.h"
 
 namespace report {
 
-/// What describeDesktop has found, with the member "remotes" where there is one; lines of at most 100
-/// columns.
+/// From here on lines have at most so many columns, 100 otherwise; what is there to be copied stays whole.
+void setColumns(std::size_t columns);
+
+/// What describeDesktop has found, with the member "remotes" where there is one.
 std::string desktopText(const Object& desktop);
 
 /// What describeButton has found.
