@@ -1,6 +1,8 @@
 """Desktops without any X server: a class a compositor."""
 import glob
 import json
+import os
+import shutil
 import subprocess
 
 from desktop import Desktop, nearest, wait
@@ -84,7 +86,91 @@ class Labwc(Wlroots):
         self.read("wlrctl", "toplevel", "focus", f"title:{title}")
 
 
+class Gnome(Wayland):
+    """An extension of its own lets it look into the shell, plugs in a keyboard, and brings new windows to the front,
+    as the shell does for those that a person opens."""
+    command = ("gnome-shell", "--headless", "--wayland", "--no-x11", "--virtual-monitor", "1280x720",
+               "--wayland-display", "wayland-1")
+    judge = """
+        const {Clutter} = imports.gi;
+        class Judge {
+            enable() {
+                global.context.unsafe_mode = true;
+                const seat = Clutter.get_default_backend().get_default_seat();
+                this.keyboard = seat.create_virtual_device(Clutter.InputDeviceType.KEYBOARD_DEVICE);
+                this.keyboard.notify_key(0, 42, 1);
+                this.keyboard.notify_key(0, 42, 0);
+                global.display.connect('window-created', (_, window) => window.get_compositor_private()
+                    .connect('first-frame', () => window.activate(global.get_current_time())));
+            }
+            disable() {}
+        }
+        """
+
+    def __init__(self):
+        super().__init__()
+        told = subprocess.run(("gnome-shell", "--version"), capture_output=True, text=True, check=True).stdout
+        self.version = told.split()[2].partition(".")[0]
+        end = "export default Judge" if int(self.version) > 44 else "function init() { return new Judge(); }"
+        self.extensions = ".local/share/gnome-shell/extensions"
+        judge = f"{self.extensions}/judge@test"
+        self.write(f"{judge}/extension.js", self.judge + end)
+        self.write(f"{judge}/metadata.json", json.dumps(
+            {"uuid": "judge@test", "name": "judge", "description": "-", "shell-version": [self.version]}))
+        self.write("shell/glib-2.0/settings/keyfile", "[org/gnome/shell]\nenabled-extensions=['judge@test', 'kvd@tarn.com']\n"
+                   f"welcome-dialog-last-shown-version='{self.version}.99'\n")
+        self.env.update(LIBGL_ALWAYS_SOFTWARE="1", DBUS_SYSTEM_BUS_ADDRESS=f"unix:path={self.runtime}/system")
+
+    def bring(self, directory, media=None, programs="kv*"):
+        extension = os.path.join(os.path.dirname(directory), "gnome-shell", "kvd@tarn.com")
+        shutil.copytree(extension, f"{self.home}/{self.extensions}/kvd@tarn.com")
+        super().bring(directory, media, programs)
+
+    def set_up(self):
+        self.start_bus()
+        self.start("dbus-daemon", "--session", "--nofork", "--nopidfile",
+                   "--address=" + self.env["DBUS_SYSTEM_BUS_ADDRESS"])
+        wait(lambda: os.path.exists(f"{self.runtime}/system"), "a system bus")
+        self.start("/usr/bin/python3", "-m", "dbusmock", "--system", "--template", "logind")
+        wait(lambda: "login1" in self.read("busctl", "--address=" + self.env["DBUS_SYSTEM_BUS_ADDRESS"], "list"),
+             "a login manager")
+        self.start_windows()
+        self.start_sound()
+
+    def start_windows(self):
+        self.server = self.start(*self.command, env={**self.env, "XDG_CONFIG_HOME": f"{self.home}/shell"})
+        self.env["WAYLAND_DISPLAY"] = f"{self.runtime}/wayland-1"
+        wait(lambda: self.eval("Main.layoutManager._startingUp") is False, "a shell that can be looked into")
+        wait(lambda: self.eval("Main.overview.hide(), Main.overview.visible") is False, "no overview")
+
+    def shell(self, verb, *words):
+        return self.read("busctl", "--user", "--json=short", verb, "org.gnome.Shell", "/org/gnome/Shell", *words)
+
+    def eval(self, script):
+        """What a script in the shell comes to; nothing where none can be run."""
+        told = json.loads(self.shell("call", "org.gnome.Shell", "Eval", "s", script) or "null")
+        return json.loads(told["data"][1] or "null") if told and told["data"][0] else None
+
+    def windows(self, *state):
+        told = self.eval("global.get_window_actors().map(({meta_window: w}) => [w.get_wm_class(), w.get_title(),"
+                         "{'state:active': w.has_focus(), 'state:fullscreen': w.is_fullscreen()}])") or []
+        return [[name, title] for name, title, has in told if all(map(has.get, state))]
+
+    def focus(self, title):
+        self.eval("global.get_window_actors().map(actor => actor.meta_window)"
+                  f".find(w => w.get_title() === '{title}')?.activate(0)")
+
+    def colour(self, x=500, y=250):
+        shot = f"{self.home}/shot.png"
+        self.read("busctl", "--user", "call", "org.gnome.Shell.Screenshot", "/org/gnome/Shell/Screenshot",
+                  "org.gnome.Shell.Screenshot", "ScreenshotArea", "iiiibs", str(x), str(y), "1", "1", "false", shot)
+        pixel = subprocess.run(("ffmpeg", "-v", "quiet", "-i", shot, "-f", "rawvideo", "-pix_fmt", "rgb24", "-"),
+                               env=self.env, timeout=20, capture_output=True, check=False).stdout
+        return nearest(pixel[:3]) if pixel else None
+
+
 COMPOSITORS = {
+    "gnome": Gnome,
     "sway": Sway,
     "labwc": Labwc,
 }
