@@ -85,6 +85,7 @@ class Windows {
             },
             'notify::focus-window', changed,
             'restacked', changed,
+            'window-entered-monitor', changed,
             'workareas-changed', changed,
             this);
         global.workspace_manager.connectObject('active-workspace-changed', changed, this);
@@ -114,12 +115,12 @@ class Windows {
 
     Activate(id) {
         const window = this._windows().find(each => each.get_stable_sequence() === id);
-        // As the person's own choice, not as a wish of the program.
-        window?.activate(global.get_current_time());
+        // Without a time it would not be brought from another workspace.
+        window?.activate(global.display.get_current_time_roundtrip());
     }
 
     _windows() {
-        return global.get_window_actors().map(actor => actor.meta_window);
+        return global.display.list_all_windows();
     }
 
     _follow(window) {

@@ -112,19 +112,29 @@ class Gnome(Wayland):
         told = subprocess.run(("gnome-shell", "--version"), capture_output=True, text=True, check=True).stdout
         self.version = told.split()[2].partition(".")[0]
         end = "export default Judge" if int(self.version) > 44 else "function init() { return new Judge(); }"
-        self.extensions = ".local/share/gnome-shell/extensions"
+        self.extensions, self.extension = ".local/share/gnome-shell/extensions", "kvd@tarn.com"
         judge = f"{self.extensions}/judge@test"
         self.write(f"{judge}/extension.js", self.judge + end)
         self.write(f"{judge}/metadata.json", json.dumps(
             {"uuid": "judge@test", "name": "judge", "description": "-", "shell-version": [self.version]}))
-        self.write("shell/glib-2.0/settings/keyfile", "[org/gnome/shell]\nenabled-extensions=['judge@test', 'kvd@tarn.com']\n"
-                   f"welcome-dialog-last-shown-version='{self.version}.99'\n")
+        # Programs write settings of their own.
+        self.settings = {"XDG_CONFIG_HOME": f"{self.home}/shell"}
+        self.enable("judge@test", self.extension)
         self.env.update(LIBGL_ALWAYS_SOFTWARE="1", DBUS_SYSTEM_BUS_ADDRESS=f"unix:path={self.runtime}/system")
 
     def bring(self, directory, media=None, programs="kv*"):
-        extension = os.path.join(os.path.dirname(directory), "gnome-shell", "kvd@tarn.com")
-        shutil.copytree(extension, f"{self.home}/{self.extensions}/kvd@tarn.com")
+        shutil.copytree(os.path.join(os.path.dirname(directory), "gnome-shell", self.extension),
+                        f"{self.home}/{self.extensions}/{self.extension}")
         super().bring(directory, media, programs)
+
+    def enable(self, *extensions):
+        """Those that are on when a shell starts; all others are as new."""
+        self.write("shell/glib-2.0/settings/keyfile", f"[org/gnome/shell]\nenabled-extensions={list(extensions)}\n"
+                   f"welcome-dialog-last-shown-version='{self.version}.99'\n")
+
+    def extension_runs(self):
+        told = self.shell("call", "org.gnome.Shell.Extensions", "GetExtensionInfo", "s", self.extension)
+        return bool(told) and json.loads(told)["data"][0].get("state", {}).get("data") == 1
 
     def set_up(self):
         self.start_bus()
@@ -138,10 +148,18 @@ class Gnome(Wayland):
         self.start_sound()
 
     def start_windows(self):
-        self.server = self.start(*self.command, env={**self.env, "XDG_CONFIG_HOME": f"{self.home}/shell"})
+        self.server = self.start(*self.command, env={**self.env, **self.settings})
         self.env["WAYLAND_DISPLAY"] = f"{self.runtime}/wayland-1"
         wait(lambda: self.eval("Main.layoutManager._startingUp") is False, "a shell that can be looked into")
         wait(lambda: self.eval("Main.overview.hide(), Main.overview.visible") is False, "no overview")
+
+    def start_kvd(self, **changes):
+        super().start_kvd(**self.settings, **changes)
+
+    def restart_windows(self):
+        self.server.kill()
+        self.server.wait()
+        self.start_windows()
 
     def shell(self, verb, *words):
         return self.read("busctl", "--user", "--json=short", verb, "org.gnome.Shell", "/org/gnome/Shell", *words)

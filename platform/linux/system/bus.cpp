@@ -1,7 +1,6 @@
 #include "platform/linux/system/bus.h"
 
 #include <cerrno>
-#include <chrono>
 #include <cstdint>
 #include <cstdlib>
 #include <cstring>
@@ -9,7 +8,7 @@
 
 #include "platform/base/failure.h"
 #include "platform/base/run_loop.h"
-#include "platform/host.h"
+#include "platform/linux/system/bus_loop.h"
 
 namespace linux::system {
 
@@ -23,38 +22,9 @@ unsigned sGeneration = 0;
 /// The turn in which a connection was last tried.
 std::optional<std::uint64_t> sTried;
 
-/// On the clock that sd_bus_get_timeout counts on, in microseconds.
-std::uint64_t monotonicTime() {
-  using std::chrono::steady_clock;
-  return static_cast<std::uint64_t>(
-      std::chrono::duration_cast<std::chrono::microseconds>(steady_clock::now().time_since_epoch()).count());
-}
-
-void putOnLoop(sd_bus* connection) {
-  sSource = base::Owned<base::Source>(new base::Source(sd_bus_get_fd(connection), 0, takeInBus));
-  // What sd-bus has read while it waited for an answer no longer shows on the descriptor.
-  sSource->prepare = [connection] {
-    std::uint64_t timeout = 0;
-    return sd_bus_get_timeout(connection, &timeout) >= 0 && timeout <= monotonicTime();
-  };
-  HostRunLoopAddSource(HostRunLoopCurrent(), HostSourceRef(sSource.get()), HostRunLoopMode::Default);
-}
-
 void loseConnection() {
-  if (sSource != nullptr) {
-    HostRunLoopRemoveSource(HostRunLoopCurrent(), HostSourceRef(sSource.get()), HostRunLoopMode::Default);
-    sSource.reset();
-  }
+  takeOffLoop(sSource);
   sBus = sd_bus_close_unref(sBus);
-}
-
-/// False when nothing came before the deadline.
-bool waitFor(sd_bus* connection, const base::Deadline& deadline) {
-  // sd_bus_wait does not count what has been read already.
-  std::uint64_t queued = 0;
-  if (sd_bus_get_n_queued_read(connection, &queued) >= 0 && queued > 0) return true;
-  const auto left = std::chrono::ceil<Limit>(deadline.left());
-  return sd_bus_wait(connection, static_cast<std::uint64_t>(left.count())) > 0;
 }
 
 /// Waits until the bus has let us in; sd-bus itself would wait for ever.
@@ -64,7 +34,7 @@ bool becomesReady(sd_bus* connection) {
     const int done = sd_bus_process(connection, nullptr);
     if (done < 0) return false;
     if (done > 0) continue;
-    if (!waitFor(connection, deadline)) return false;
+    if (!waitForArrival(connection, deadline)) return false;
   }
   return sd_bus_is_ready(connection) > 0;
 }
@@ -87,7 +57,7 @@ void connect() {
   }
   sBus = connection;
   ++sGeneration;
-  putOnLoop(connection);
+  sSource = putOnLoop(connection, takeInBus);
 }
 
 }  // namespace
@@ -109,15 +79,10 @@ void closeBus() {
 unsigned busGeneration() { return sGeneration; }
 
 void takeInBus() {
-  constexpr int kMostMessages = 256;
-  if (sBus == nullptr) return;
-  int done = 1;
-  for (int i = 0; done > 0 && i < kMostMessages; ++i) done = sd_bus_process(sBus, nullptr);
-  // Busy means that this was called from a handler of a message, which the caller up there goes on with.
-  if (done < 0 && done != -EBUSY) loseConnection();
+  if (sBus != nullptr && !handleArrived(sBus)) loseConnection();
 }
 
-bool waitForBus(const base::Deadline& deadline) { return sBus != nullptr && waitFor(sBus, deadline); }
+bool waitForBus(const base::Deadline& deadline) { return sBus != nullptr && waitForArrival(sBus, deadline); }
 
 Message makeCall(const Callee& callee, const Method& method) {
   sd_bus* const connection = bus();

@@ -2,7 +2,9 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <utility>
 
+#include "platform/linux/windows/gnome/accessibility.h"
 #include "platform/linux/windows/gnome/keyboard.h"
 #include "platform/linux/windows/gnome/shell.h"
 
@@ -10,67 +12,86 @@ namespace linux::windows::gnome {
 
 namespace {
 
+/// As last taken in, and as known since.
 std::vector<Window> sWindows;
-/// shellChanges() when they were taken over.
-unsigned sChanges = 0;
+std::vector<Window> sNow;
 
 /// Under X11 the X server knows all that the shell does.
 bool isOnWayland() { return std::getenv("WAYLAND_DISPLAY") != nullptr; }
 
-bool open() { return isOnWayland() && takeInShell() != Shell::None; }
+std::vector<Window> windowsNow() {
+  if (shell() == Shell::Telling) return windowsTold();
+  return shell() == Shell::Silent ? windowsByAccessibility() : std::vector<Window>();
+}
+
+bool open() {
+  const Shell there = isOnWayland() ? takeInShell() : Shell::None;
+  if (there == Shell::Silent) {
+    takeInAccessibility();
+  } else {
+    forgetAccessibility();
+  }
+  sNow = windowsNow();
+  for (Window& window : sNow) window.id.backend = &kBackend;
+  if (!sNow.empty()) prepareKeyboard();
+  return there != Shell::None;
+}
 
 bool takeIn() {
   open();
-  if (sChanges == shellChanges()) return false;
-  sChanges = shellChanges();
-  sWindows = windowsTold();
-  for (Window& window : sWindows) window.id.backend = &kBackend;
+  if (sWindows == sNow) return false;
+  sWindows = sNow;
   return true;
 }
 
 const Window* find(std::uint64_t number) {
-  const auto& told = windowsTold();
-  const auto found = std::ranges::find(told, number, [](const Window& window) { return window.id.number; });
-  return found != told.end() ? &*found : nullptr;
+  const auto found = std::ranges::find(sNow, number, [](const Window& window) { return window.id.number; });
+  return found != sNow.end() ? &*found : nullptr;
 }
 
 void look(std::span<Window> windows) {
   open();
   for (Window& window : windows) {
-    const Window* const told = find(window.id.number);
-    if (told == nullptr) {
+    const Window* const now = find(window.id.number);
+    if (now == nullptr) {
       window.isFullScreen = window.isShown = false;
       continue;
     }
-    const bool isActive = window.isActive;
-    window = *told;
-    window.id.backend = &kBackend;
+    const bool isActive = std::exchange(window, *now).isActive;
     window.isActive = isActive;
   }
 }
 
+/// Accessibility knows of some programs only: where it knows nobody the X server may, of those on XWayland.
+bool knowsFront() {
+  return shell() == Shell::Telling ||
+         std::ranges::any_of(sNow, [](const Window& each) { return each.isActive; });
+}
+
 bool sendKey(std::uint64_t window, std::uint32_t keysym, bool down, Modifiers modifiers) {
   open();
-  const Window* const told = find(window);
+  const Window* const now = find(window);
   // Whoever has come to the front meanwhile must not get it; a release is owed whoever is there.
-  if (down && (told == nullptr || !told->isActive)) return false;
+  if (down && (now == nullptr || !now->isActive)) return false;
   return tapKey(keysym, down, modifiers);
+}
+
+void close() {
+  dropKeyboard();
+  forgetAccessibility();
+  forgetShell();
 }
 
 }  // namespace
 
 const Backend kBackend{
     .open = open,
-    .close =
-        [] {
-          dropKeyboard();
-          forgetShell();
-        },
+    .close = close,
     .takeIn = takeIn,
     .list = []() -> const std::vector<Window>& { return sWindows; },
     .look = look,
-    .knowsFront = [] { return shell() == Shell::Telling; },
-    .reach = [] { return shell() == Shell::Telling ? Reach::FocusedWindow : Reach::Nobody; },
+    .knowsFront = knowsFront,
+    .reach = [] { return shell() != Shell::None ? Reach::FocusedWindow : Reach::Nobody; },
     .activate = activateTold,
     .sendKey = sendKey,
     .outputs = [] { return outputsTold(); },

@@ -40,6 +40,8 @@ constexpr HeldWith kModifiers[] = {
 /// Where the session is, empty without one; it can be used once it is open.
 std::string sSession;
 bool sIsOpen = false;
+/// One has been opened ahead of the first key since the shell is there.
+bool sIsPrepared = false;
 /// The answer that opening waits for.
 system::Slot sOpening;
 HostTimerRef sUnused;
@@ -99,6 +101,7 @@ int takeClosed(sd_bus_message* signal, void*, sd_bus_error*) {
 
 int takeOwner(sd_bus_message*, void*, sd_bus_error*) {
   forgetSession();
+  sIsPrepared = false;
   return 0;
 }
 
@@ -108,11 +111,18 @@ void follow(const std::string& match, sd_bus_message_handler_t take) {
 
 void beginAnew() {
   forgetSession();
+  sIsPrepared = false;
   sGeneration = system::busGeneration();
   follow(std::string("type='signal',interface='") + kSessionInterface + "',member='Closed'", takeClosed);
   follow(std::string("type='signal',sender='org.freedesktop.DBus',interface='org.freedesktop.DBus',") +
              "member='NameOwnerChanged',arg0='" + kDesktop.name + "'",
          takeOwner);
+}
+
+void beginToOpen() {
+  if (sIsOpen || sOpening != nullptr) return;
+  sOpening = system::callLater(system::makeCall(kDesktop, {kPath, kInterface, "CreateSession"}), takeSession,
+                               nullptr);
 }
 
 void awaitOpening() {
@@ -135,15 +145,14 @@ bool send(std::uint32_t keysym, bool down) {
 void prepareKeyboard() {
   if (system::bus() == nullptr) return;
   if (sGeneration != system::busGeneration()) beginAnew();
-  if (sIsOpen || sOpening != nullptr) return;
-  sOpening = system::callLater(system::makeCall(kDesktop, {kPath, kInterface, "CreateSession"}), takeSession,
-                               nullptr);
+  if (!std::exchange(sIsPrepared, true)) beginToOpen();
 }
 
 bool tapKey(std::uint32_t keysym, bool down, Modifiers modifiers) {
   // A session that has been closed has released its keys.
   if (!down && !sIsOpen) return false;
   prepareKeyboard();
+  beginToOpen();
   awaitOpening();
   if (!sIsOpen) return false;
   startTimer();

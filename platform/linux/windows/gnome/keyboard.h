@@ -10,7 +10,7 @@
 
 namespace linux::windows::gnome {
 
-/// Begins to open a session where there is none, and waits for nothing.
+/// Begins to open a session, once for each shell that comes, and waits for nothing.
 void prepareKeyboard();
 
 /// Presses or releases a key; waits for a session where there is none. False when there is no session to be

@@ -34,7 +34,6 @@ constexpr std::size_t kMostOutputs = 32;
 Shell sShell = Shell::None;
 std::vector<Window> sWindows;
 std::vector<Output> sOutputs;
-unsigned sChanges = 0;
 /// Shells that have come so far: each numbers its windows anew.
 std::uint64_t sShells = 0;
 /// The connection that all this is known from.
@@ -116,7 +115,6 @@ std::vector<Output> readOutputs(sd_bus_message* message) {
 }
 
 void take(Shell shell, std::vector<Window> windows, std::vector<Output> outputs) {
-  if (sShell != shell || sWindows != windows) ++sChanges;
   sShell = shell;
   sWindows = std::move(windows);
   sOutputs = std::move(outputs);
@@ -200,8 +198,6 @@ Shell takeInShell() {
 }
 
 Shell shell() { return sShell; }
-
-unsigned shellChanges() { return sChanges; }
 
 const std::vector<Window>& windowsTold() { return sWindows; }
 

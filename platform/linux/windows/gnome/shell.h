@@ -23,8 +23,6 @@ Shell takeInShell();
 /// Who was there when that was last done.
 Shell shell();
 
-/// Counts changes of what is told, and of who is there.
-unsigned shellChanges();
 /// The windows told of, topmost first, without the back end in their ids; none unless one is telling.
 const std::vector<Window>& windowsTold();
 const std::vector<Output>& outputsTold();

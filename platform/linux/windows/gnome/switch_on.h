@@ -3,8 +3,8 @@
 
 namespace linux::windows::gnome {
 
-/// Has the shell run the extension where it is installed and nobody has switched it on or off yet; what the shell
-/// has answered once it is not asked again. Waits for nobody.
+/// Has the shell run the extension where it is installed and nobody has switched it on or off yet; asks the
+/// shell once, and waits for nothing.
 void switchOn();
 
 /// Another shell is there, or none.
