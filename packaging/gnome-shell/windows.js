@@ -24,7 +24,6 @@ const TYPES = [
 ];
 
 const CHANGES_OF_WINDOW = [
-    'notify::title',
     'notify::wm-class',
     'notify::gtk-application-id',
     'notify::minimized',
@@ -74,6 +73,7 @@ function describe(window) {
 class Windows {
     constructor() {
         this._isAwaited = true;
+        this._timer = 0;
         this._object = Gio.DBusExportedObject.wrapJSObject(INTERFACE, this);
         this._object.export(Gio.DBus.session, OBJECT_PATH);
 
@@ -99,6 +99,8 @@ class Windows {
         global.display.disconnectObject(this);
         this._change();
         this._object.unexport();
+        if (this._timer)
+            GLib.source_remove(this._timer);
     }
 
     List() {
@@ -126,6 +128,18 @@ class Windows {
     _follow(window) {
         const changed = () => this._change();
         window.connectObject(...CHANGES_OF_WINDOW.flatMap(signal => [signal, changed]), this);
+        window.connectObject('notify::title', () => this._changeTitle(), this);
+    }
+
+    // Some programs turn a wheel in their titles.
+    _changeTitle() {
+        if (!this._isAwaited || this._timer)
+            return;
+        this._timer = GLib.timeout_add_seconds(GLib.PRIORITY_DEFAULT, 1, () => {
+            this._timer = 0;
+            this._change();
+            return GLib.SOURCE_REMOVE;
+        });
     }
 
     _change() {

@@ -25,7 +25,7 @@ bool sHasAnswered = false;
 
 /// Whether the person has switched it off in an earlier session; true too when nobody can tell.
 bool wasSwitchedOff() {
-  constexpr std::size_t kLongestList = 64 * 1024;
+  constexpr std::size_t kLongestList = 1 << 16;
   base::Subprocess settings{.path = "/usr/bin/gsettings",
                             .arguments = {"gsettings", "get", "org.gnome.shell", "disabled-extensions"},
                             .discardsErrors = true};
