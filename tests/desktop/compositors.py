@@ -2,10 +2,13 @@
 import glob
 import json
 import os
+import re
 import shutil
 import subprocess
 
 from desktop import Desktop, nearest, wait
+
+ENTRY = os.path.join(os.path.dirname(os.path.realpath(__file__)), "../../packaging/applications/kvd.desktop.in")
 
 
 class Wayland(Desktop):
@@ -187,8 +190,66 @@ class Gnome(Wayland):
         return nearest(pixel[:3]) if pixel else None
 
 
+class KWin(Wayland):
+    """What it tells to programs that have a desktop entry, kvd asks for; the scenes ask by scripts of their own."""
+    command = ("kwin_wayland", "--virtual", "--no-lockscreen", "--width", "1280", "--height", "720",
+               "--socket", "wayland-0")
+    scripts = 0
+
+    def __init__(self):
+        super().__init__()
+        self.env["XDG_CONFIG_DIRS"] = os.path.join(self.home, "xdg")
+        # Without a menu there are no programs.
+        self.write("xdg/menus/applications.menu", "<Menu><Name>All</Name><DefaultAppDirs/><Include><All/></Include></Menu>")
+        self.let_in()
+
+    def let_in(self):
+        with open(ENTRY, encoding="utf-8") as entry:
+            self.write(".local/share/applications/kvd.desktop", entry.read().replace("@KVD_PROGRAM@", f"{self.home}/kvd"))
+
+    def set_up(self):
+        self.start_bus()
+        self.start_windows()
+        self.start_sound()
+
+    def start_windows(self):
+        super().start_windows()
+        wait(lambda: "org.kde.KWin" in self.names(), "KWin takes scripts")
+
+    def ask(self, script):
+        """What a script returns that KWin runs: it writes that to its log."""
+        self.scripts += 1
+        name = f"script-{self.scripts}"
+        self.write(name, f"console.error('{name}', JSON.stringify((() => {{ {script} }})()))")
+        for call in (("loadScript", "ss", os.path.join(self.home, name), name), ("start",)):
+            self.read("busctl", "--user", "call", "org.kde.KWin", "/Scripting", "org.kde.kwin.Scripting", *call)
+
+        def answer():
+            with open(os.path.join(self.home, "log"), encoding="utf-8", errors="replace") as log:
+                return re.findall(f"{name} (.*)", log.read())
+        return json.loads(wait(answer, "a script's answer")[0])
+
+    def windows(self, *state):
+        is_state = {"state:active": "w.active", "state:fullscreen": "w.fullScreen"}
+        return self.ask("return workspace.windowList().filter(w => w.normalWindow"
+                        + "".join(f" && {is_state[each]}" for each in state)
+                        + ").map(w => [w.desktopFileName || w.resourceClass, w.caption])")
+
+    def focus(self, title):
+        self.ask(f"workspace.activeWindow = workspace.windowList().find(w => w.caption === '{title}');"
+                 "return true")
+
+
+class StrictKWin(KWin):
+    """Lets nobody ask."""
+    def let_in(self):
+        pass
+
+
 COMPOSITORS = {
     "gnome": Gnome,
     "sway": Sway,
     "labwc": Labwc,
+    "kwin": KWin,
+    "strict-kwin": StrictKWin,
 }

@@ -23,7 +23,6 @@
 #include "platform/linux/windows/wayland/keyboard.h"
 #include "platform/linux/windows/wayland/outputs.h"
 #include "platform/linux/windows/wayland/seat.h"
-#include "virtual_keyboard.h"
 
 namespace linux::windows::wayland {
 
@@ -44,16 +43,16 @@ std::vector<const Part*> sParts;
 
 /// What every part may need.
 constexpr Interest kShared[] = {
-    {&wl_output_interface, addOutput},
-    {&wl_seat_interface, takeSeat},
-    {&zwp_virtual_keyboard_manager_v1_interface, takeKeyboards},
+    {"wl_output", addOutput},
+    {"wl_seat", takeSeat},
+    {"zwp_virtual_keyboard_manager_v1", takeKeyboards},
 };
 
 void addGlobal(void*, wl_registry* registry, std::uint32_t name, const char* interface,
                std::uint32_t version) {
   const auto offerTo = [&](std::span<const Interest> interests) {
     for (const Interest& interest : interests) {
-      if (std::string_view(interface) == interest.interface->name) interest.take({registry, name, version});
+      if (interest.interface == interface) interest.take({registry, name, version});
     }
   };
   offerTo(kShared);

@@ -9,6 +9,7 @@
 #include <cstdint>
 #include <span>
 #include <string>
+#include <string_view>
 
 struct wl_display;
 struct wl_interface;
@@ -28,7 +29,7 @@ void* accept(const Offer& offer, const wl_interface& interface, std::uint32_t ne
 
 /// What becomes of an offer of this interface.
 struct Interest {
-  const wl_interface* interface = nullptr;
+  std::string_view interface;
   void (*take)(const Offer& offer) = nullptr;
 };
 

@@ -32,12 +32,17 @@ void addPlaces(xkb_keymap* keymap, xkb_keycode_t code, void* data) {
   }
 }
 
+using Context = std::unique_ptr<xkb_context, decltype(&xkb_context_unref)>;
+
+Context makeContext() {
+  return Context(xkb_context_new(XKB_CONTEXT_NO_ENVIRONMENT_NAMES), xkb_context_unref);
+}
+
 }  // namespace
 
 Keymap makeKeymap() {
   Keymap made;
-  const std::unique_ptr<xkb_context, decltype(&xkb_context_unref)> context(
-      xkb_context_new(XKB_CONTEXT_NO_ENVIRONMENT_NAMES), xkb_context_unref);
+  const Context context = makeContext();
   if (context == nullptr) return made;
   constexpr xkb_rule_names kAmerican{"evdev", "pc105", "us", "", ""};
   const std::unique_ptr<xkb_keymap, decltype(&xkb_keymap_unref)> keymap(
@@ -49,6 +54,19 @@ Keymap makeKeymap() {
   made.text = text.get();
   xkb_keymap_key_for_each(keymap.get(), addPlaces, &made.places);
   return made;
+}
+
+std::map<std::uint32_t, Place> placesIn(std::string_view text) {
+  std::map<std::uint32_t, Place> places;
+  text = text.substr(0, text.find('\0'));
+  const Context context = makeContext();
+  if (context == nullptr) return places;
+  const std::unique_ptr<xkb_keymap, decltype(&xkb_keymap_unref)> keymap(
+      xkb_keymap_new_from_buffer(context.get(), text.data(), text.size(), XKB_KEYMAP_FORMAT_TEXT_V1,
+                                 XKB_KEYMAP_COMPILE_NO_FLAGS),
+      xkb_keymap_unref);
+  if (keymap != nullptr) xkb_keymap_key_for_each(keymap.get(), addPlaces, &places);
+  return places;
 }
 
 std::uint32_t maskOf(Modifiers modifiers) {

@@ -1,9 +1,10 @@
-// The keyboard that kvd types on: which key makes which symbol.
+// Keyboards to type on: which key makes which symbol.
 #pragma once
 
 #include <cstdint>
 #include <map>
 #include <string>
+#include <string_view>
 
 #include "platform/linux/windows/backend.h"
 
@@ -26,7 +27,10 @@ struct Keymap {
 /// positions expect it. Empty where xkb's files are missing.
 Keymap makeKeymap();
 
-/// Modifiers in the bits that this keyboard has for them.
+/// The keys of a keyboard that xkb's text describes, in its first layout; none when it is no such text.
+std::map<std::uint32_t, Place> placesIn(std::string_view text);
+
+/// Modifiers in the bits that every keyboard has for them.
 std::uint32_t maskOf(Modifiers modifiers);
 
 }  // namespace linux::windows::wayland

@@ -3,7 +3,6 @@
 #include <optional>
 #include <string>
 
-#include "foreign_toplevel.h"
 #include "platform/linux/windows/wayland/connection.h"
 #include "platform/linux/windows/wayland/keyboard.h"
 #include "platform/linux/windows/wayland/outputs.h"
@@ -21,7 +20,7 @@ std::vector<Window> sWindows;
 /// toplevelChanges() when they were read.
 unsigned sChanges = 0;
 
-constexpr wayland::Interest kInterests[] = {{&zwlr_foreign_toplevel_manager_v1_interface, takeManager}};
+constexpr wayland::Interest kInterests[] = {{"zwlr_foreign_toplevel_manager_v1", takeManager}};
 
 extern const wayland::Part kPart;
 
