@@ -69,3 +69,17 @@ def compositor_restarts(desktop):
     os.remove(desktop.env["WAYLAND_DISPLAY"])
     desktop.start_windows()
     Terminal(desktop, "darktable").follow(("right", {"keys": RIGHT}))
+
+
+def full_screen_is_captured(desktop):
+    """The arrow then raises the volume; no key can be relied on for it."""
+    desktop.start_kvd()
+    photos = Terminal(desktop, "darktable")
+    desktop.volume(50)
+    desktop.press("up")
+    stays(lambda: desktop.volume() == 50, "nothing covers the screen")
+    photos.end()
+    Terminal(desktop, "darktable", "--fullscreen").become(full_screen=["darktable"])
+    desktop.press("up")
+    wait(lambda: desktop.volume() > 50, "the arrow raises the volume")
+    desktop.rests()

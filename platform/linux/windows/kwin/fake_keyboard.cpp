@@ -87,8 +87,10 @@ void dropFakeInput() {
 
 void prepareKeyboard() {
   if (sInput == nullptr) return;
-  sPlaces = wayland::makeKeymap().places;
-  if (!wayland::seatHasKeyboard()) return;
+  if (!wayland::seatHasKeyboard()) {
+    sPlaces = wayland::makeKeymap().places;
+    return;
+  }
   sKeyboard = wl_seat_get_keyboard(wayland::seat());
   wl_keyboard_add_listener(sKeyboard, &kListener, nullptr);
 }

@@ -5,7 +5,7 @@
 #include "platform/linux/windows/kwin/desktops.h"
 #include "platform/linux/windows/kwin/fake_keyboard.h"
 #include "platform/linux/windows/kwin/plasma_windows.h"
-#include "platform/linux/windows/kwin/script.h"
+#include "platform/linux/windows/kwin/reports.h"
 #include "platform/linux/windows/wayland/connection.h"
 #include "platform/linux/windows/wayland/outputs.h"
 
@@ -37,7 +37,7 @@ const wayland::Part kPart{
           dropManager();
           dropDesktops();
           dropFakeInput();
-          closeScript();
+          closeReports();
           sIsKWin = false;
         },
 };
@@ -47,7 +47,7 @@ const wayland::Part kPart{
 const Source* source() {
   if (wayland::connection() == nullptr) return nullptr;
   if (wayland::speaks(kPart)) return &kPlasma;
-  return sIsKWin && wayland::nobodySpeaks() && openScript() ? &kScript : nullptr;
+  return sIsKWin && wayland::nobodySpeaks() && openReports() ? &kReports : nullptr;
 }
 
 bool isOpen() { return source() != nullptr; }

@@ -1,10 +1,6 @@
-#include "platform/linux/windows/kwin/script.h"
-
-#include <sys/mman.h>
-#include <unistd.h>
+#include "platform/linux/windows/kwin/reports.h"
 
 #include <algorithm>
-#include <cerrno>
 #include <nlohmann/json.hpp>
 #include <optional>
 #include <string>
@@ -12,11 +8,11 @@
 #include <utility>
 
 #include "platform/base/deadline.h"
-#include "platform/base/file_descriptor.h"
 #include "platform/base/run_loop.h"
 #include "platform/linux/system/bus.h"
 #include "platform/linux/system/turn.h"
-#include "platform/linux/windows/kwin/window_script.h"
+#include "platform/linux/windows/kwin/script_texts.h"
+#include "platform/linux/windows/kwin/scripting.h"
 #include "platform/linux/windows/wayland/outputs.h"
 
 namespace linux::windows::kwin {
@@ -25,7 +21,6 @@ namespace {
 
 using Json = nlohmann::json;
 
-constexpr char kKWin[] = "org.kde.KWin";
 constexpr char kPath[] = "/windows";
 constexpr char kInterface[] = "com.tarn.kvd.Windows";
 constexpr char kMember[] = "Tell";
@@ -40,6 +35,9 @@ struct Reported {
 
 /// Takes the script's calls, as long as there is a script on this connection to the bus.
 system::Slot sObject;
+RunningScript sScript;
+/// What was last asked of KWin beside that.
+RunningScript sErrand;
 unsigned sGeneration = 0;
 /// KWin's unique name on the bus.
 std::string sOwner;
@@ -49,15 +47,6 @@ std::optional<std::uint64_t> sTried;
 std::vector<Reported> sReported;
 std::uint64_t sLastNumber = 0;
 unsigned sChanges = 0;
-
-/// The script's name, each program's its own.
-std::string scriptName() { return program_invocation_short_name; }
-
-template <typename... Arguments>
-system::Message callScripting(const char* member, const char* types, Arguments... arguments) {
-  return system::call({kKWin, 0}, {"/Scripting", "org.kde.kwin.Scripting", member}, system::kQueryLimit,
-                      types, arguments...);
-}
 
 /// The window's number in the last report; a new one where it was not in it.
 std::uint64_t numberOf(std::string_view uuid) {
@@ -111,7 +100,7 @@ int takeCall(sd_bus_message* message, void*, sd_bus_error*) {
 std::string ownerOfKWin() {
   const auto answer = system::call({"org.freedesktop.DBus", 0},
                                    {"/org/freedesktop/DBus", "org.freedesktop.DBus", "GetNameOwner"},
-                                   system::kQueryLimit, "s", kKWin);
+                                   system::kQueryLimit, "s", kKWinName);
   const char* owner = nullptr;
   if (answer == nullptr || sd_bus_message_read(answer.get(), "s", &owner) <= 0) return {};
   return owner;
@@ -121,19 +110,7 @@ std::string ownerOfKWin() {
 std::string scriptFor(std::string_view name) {
   std::string script = "function tell(windows) { callDBus(\"";
   script.append(name).append("\", \"").append(kPath).append("\", \"").append(kInterface).append("\", \"");
-  return script.append(kMember).append("\", windows); }\n").append(kWindowScript);
-}
-
-/// Has KWin read and run it. False when it does not.
-bool runScript(const base::FileDescriptor& file) {
-  const std::string path = "/proc/" + std::to_string(getpid()) + "/fd/" + std::to_string(file.get());
-  const std::string name = scriptName();
-  // One of the name may be left of a program that did not come to its end.
-  callScripting("unloadScript", "s", name.c_str());
-  const auto loaded = callScripting("loadScript", "ss", path.c_str(), name.c_str());
-  int number = -1;
-  return loaded != nullptr && sd_bus_message_read(loaded.get(), "i", &number) > 0 && number >= 0 &&
-         callScripting("start", "") != nullptr;
+  return script.append(kMember).append("\", windows); }\n").append(kReportScript);
 }
 
 void load() {
@@ -146,21 +123,30 @@ void load() {
   }
   sObject.reset(object);
   sGeneration = system::busGeneration();
-  const base::FileDescriptor file(memfd_create("windows", MFD_CLOEXEC));
+  const std::string name = scriptName("reports");
+  unloadLeftover(name);
+  sScript = RunningScript(name, scriptFor(self));
   const system::Limit limit = system::patience(system::kQueryLimit);
   const base::Deadline deadline(limit);
-  if (base::writeAll(file, scriptFor(self)) && runScript(file)) {
-    while (!sHasTold && system::waitForBus(deadline)) system::takeInBus();
-  }
+  while (!sHasTold && system::waitForBus(deadline)) system::takeInBus();
   if (sHasTold) return;
   if (deadline.hasPassed()) system::noteWaitInVain(limit);
-  closeScript();
+  closeReports();
+}
+
+void activate(std::uint64_t number) {
+  const auto found =
+      std::ranges::find(sReported, number, [](const Reported& each) { return each.window.id.number; });
+  if (found == sReported.end()) return;
+  static unsigned errands = 0;
+  const std::string name = scriptName("errand-" + std::to_string(++errands));
+  sErrand = RunningScript(name, "const uuid = " + Json(found->uuid).dump() + ";" + kActivateScript);
 }
 
 }  // namespace
 
-bool openScript() {
-  if (sObject != nullptr && sGeneration != system::busGeneration()) closeScript();
+bool openReports() {
+  if (sObject != nullptr && sGeneration != system::busGeneration()) closeReports();
   if (sObject == nullptr && sTried != base::turn()) {
     sTried = base::turn();
     load();
@@ -168,17 +154,16 @@ bool openScript() {
   return sHasTold;
 }
 
-void closeScript() {
-  if (sObject == nullptr) return;
-  system::send({kKWin, 0}, {"/Scripting", "org.kde.kwin.Scripting", "unloadScript"}, "s",
-               scriptName().c_str());
+void closeReports() {
+  sErrand = {};
+  sScript = {};
   sObject.reset();
   sHasTold = false;
   sReported.clear();
   ++sChanges;
 }
 
-const Source kScript{
+const Source kReports{
     .changes = [] { return sChanges; },
     .windows =
         [] {
@@ -186,15 +171,7 @@ const Source kScript{
           for (const Reported& each : sReported) windows.push_back(each.window);
           return windows;
         },
-    .activate =
-        [](std::uint64_t window) {
-          const auto known =
-              std::ranges::find(sReported, window, [](const auto& each) { return each.window.id.number; });
-          if (known == sReported.end()) return;
-          // What KWin offers to launchers: the first action for a window is to activate it.
-          system::send({kKWin, 0}, {"/WindowsRunner", "org.kde.krunner1", "Run"}, "ss",
-                       ("0_" + known->uuid).c_str(), "");
-        },
+    .activate = activate,
 };
 
 }  // namespace linux::windows::kwin

@@ -1,11 +1,12 @@
-// What kvd has KWin run where it may not ask for windows itself.
+// The scripts that kvd has KWin run where it may not ask for windows itself. The names on the right of || are
+// those of Plasma 5.
 #pragma once
 
 namespace linux::windows::kwin {
 
 /// Calls tell(windows), which is put before it, with the windows, in JSON, topmost first, as often as
-/// something about them has changed. The names on the right of || are those of Plasma 5.
-inline constexpr char kWindowScript[] = R"js(
+/// something about them has changed.
+inline constexpr char kReportScript[] = R"js(
 function list() {
   return workspace.windowList ? workspace.windowList() : workspace.clientList();
 }
@@ -55,6 +56,13 @@ list().forEach(follow);
 (workspace.windowActivated || workspace.clientActivated).connect(() => report());
 workspace.currentDesktopChanged.connect(() => report());
 report();
+)js";
+
+/// Activates the window with the id `uuid`, which is put before it.
+inline constexpr char kActivateScript[] = R"js(
+const windows = workspace.windowList ? workspace.windowList() : workspace.clientList();
+const found = windows.find(each => String(each.internalId) === uuid);
+if (found) workspace[workspace.windowList ? "activeWindow" : "activeClient"] = found;
 )js";
 
 }  // namespace linux::windows::kwin
