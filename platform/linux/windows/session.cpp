@@ -12,7 +12,8 @@ namespace linux::windows {
 
 namespace {
 
-constexpr std::string_view kVariables[] = {"DISPLAY", "XAUTHORITY", "WAYLAND_DISPLAY", "SWAYSOCK"};
+constexpr std::string_view kVariables[] = {"DISPLAY", "XAUTHORITY", "WAYLAND_DISPLAY", "SWAYSOCK",
+                                           "HYPRLAND_INSTANCE_SIGNATURE"};
 
 /// The turn in which the service manager was last asked, and whether it told anything new.
 std::optional<std::uint64_t> sAsked;

@@ -3,7 +3,39 @@
 #include <algorithm>
 #include <iterator>
 
+#include "platform/base/deadline.h"
+#include "platform/linux/system/turn.h"
+#include "platform/linux/windows/wlr/hyprland.h"
+#include "platform/linux/windows/wlr/sway.h"
+
 namespace linux::windows::wlr {
+
+namespace {
+
+using Question = std::vector<Container> (*)(pid_t compositor, const base::Deadline& deadline);
+
+constexpr Question kLanguages[] = {
+    askSway,
+    askHyprland,
+};
+
+/// The windows as the compositor tells them in its own language; none where it has none that is known.
+std::vector<Container> readContainers(pid_t compositor) {
+  if (compositor == 0 || system::timedOutThisTurn(compositor)) return {};
+  const system::Limit limit = system::patience(system::kQueryLimit);
+  const base::Deadline deadline(limit);
+  for (const Question ask : kLanguages) {
+    auto containers = ask(compositor, deadline);
+    if (!containers.empty()) return containers;
+  }
+  if (deadline.hasPassed()) {
+    system::noteWaitInVain(limit);
+    system::noteTimeout(compositor);
+  }
+  return {};
+}
+
+}  // namespace
 
 void findProcesses(pid_t compositor, const std::vector<wayland::Toplevel*>& windows) {
   std::vector<wayland::Toplevel*> unknown;

@@ -8,7 +8,7 @@
 #include <vector>
 
 #include "platform/linux/windows/wayland/toplevels.h"
-#include "platform/linux/windows/wlr/sway.h"
+#include "platform/linux/windows/wlr/container.h"
 
 namespace linux::windows::wlr {
 

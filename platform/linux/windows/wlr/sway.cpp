@@ -1,12 +1,9 @@
 #include "platform/linux/windows/wlr/sway.h"
 
-#include <poll.h>
-#include <sys/socket.h>
 #include <unistd.h>
 
 #include <algorithm>
 #include <array>
-#include <cerrno>
 #include <cstdlib>
 #include <cstring>
 #include <nlohmann/json.hpp>
@@ -14,8 +11,7 @@
 
 #include "platform/base/deadline.h"
 #include "platform/base/file_descriptor.h"
-#include "platform/linux/system/local_socket.h"
-#include "platform/linux/system/turn.h"
+#include "platform/linux/windows/wlr/ipc.h"
 
 namespace linux::windows::wlr {
 
@@ -31,9 +27,6 @@ struct Header {
 constexpr std::size_t kHeaderSize = 14;
 constexpr std::uint32_t kGetTree = 4;
 
-/// Hundreds of windows are less than that.
-constexpr std::size_t kLongestAnswer = 1 << 20;
-
 /// Each compositor's own socket goes by its process; a variable may name another one, or one of long ago.
 base::FileDescriptor connectToCompositor(pid_t compositor) {
   const char* const directory = std::getenv("XDG_RUNTIME_DIR");
@@ -41,48 +34,26 @@ base::FileDescriptor connectToCompositor(pid_t compositor) {
   const std::string own = std::string(directory != nullptr ? directory : "") + "/sway-ipc." +
                           std::to_string(getuid()) + "." + std::to_string(compositor) + ".sock";
   for (const std::string& path : {own, std::string(named != nullptr ? named : "")}) {
-    base::FileDescriptor socket = system::connectTo(path);
-    if (socket && system::listenerOf(socket.get()) == compositor) return socket;
+    base::FileDescriptor socket = connectTo(path, compositor);
+    if (socket) return socket;
   }
   return base::FileDescriptor();
 }
 
-/// Reads until there are so many bytes. False when no more come, and when the time is up.
-bool readUpTo(std::size_t size, const base::FileDescriptor& socket, const base::Deadline& deadline,
-              std::string& answer) {
-  while (answer.size() < size) {
-    if (!base::waitFor(socket.get(), POLLIN, deadline)) return false;
-    std::array<char, 16384> part{};
-    const ssize_t count = recv(socket.get(), part.data(), std::min(part.size(), size - answer.size()), 0);
-    if (count == 0 || (count < 0 && errno != EINTR && errno != EAGAIN)) return false;
-    if (count > 0) answer.append(part.data(), static_cast<std::size_t>(count));
-  }
-  return true;
-}
-
-std::string ask(const base::FileDescriptor& socket, std::uint32_t type, const base::Deadline& deadline) {
+std::string askFor(std::uint32_t type, const base::FileDescriptor& socket, const base::Deadline& deadline) {
   Header header;
   header.lengthAndType = {0, type};
   std::array<char, kHeaderSize> question{};
   std::memcpy(question.data(), header.magic.data(), header.magic.size());
   std::memcpy(question.data() + header.magic.size(), header.lengthAndType.data(),
               sizeof header.lengthAndType);
-  // So few bytes always have room in a socket that is new.
-  if (send(socket.get(), question.data(), question.size(), MSG_NOSIGNAL) != ssize_t{kHeaderSize}) return {};
+  if (!ask(socket, {question.data(), question.size()})) return {};
   std::string answer;
   if (!readUpTo(kHeaderSize, socket, deadline, answer)) return {};
   std::uint32_t length = 0;
   std::memcpy(&length, answer.data() + header.magic.size(), sizeof length);
   if (length > kLongestAnswer || !readUpTo(kHeaderSize + length, socket, deadline, answer)) return {};
   return answer.substr(kHeaderSize);
-}
-
-template <typename T>
-T valueIn(const Json& node, const char* member) {
-  const auto found = node.find(member);
-  if (found == node.end()) return T();
-  const T* const value = found->template get_ptr<const T*>();
-  return value != nullptr ? *value : T();
 }
 
 Container containerOf(const Json& node, const std::string& output) {
@@ -98,21 +69,13 @@ Container containerOf(const Json& node, const std::string& output) {
 
 }  // namespace
 
-std::vector<Container> readContainers(pid_t compositor) {
-  if (compositor == 0 || system::timedOutThisTurn(compositor)) return {};
+std::vector<Container> askSway(pid_t compositor, const base::Deadline& deadline) {
   const base::FileDescriptor socket = connectToCompositor(compositor);
   if (!socket) return {};
-  const system::Limit limit = system::patience(system::kQueryLimit);
-  const base::Deadline deadline(limit);
-  const std::string tree = ask(socket, kGetTree, deadline);
-  if (tree.empty() && deadline.hasPassed()) {
-    system::noteWaitInVain(limit);
-    system::noteTimeout(compositor);
-  }
-  return containersIn(tree);
+  return swayWindowsIn(askFor(kGetTree, socket, deadline));
 }
 
-std::vector<Container> containersIn(std::string_view tree) {
+std::vector<Container> swayWindowsIn(std::string_view tree) {
   std::vector<Container> found;
   const Json root = Json::parse(tree, nullptr, false);
   struct Pending {
