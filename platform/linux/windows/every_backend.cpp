@@ -1,5 +1,6 @@
 #include "platform/linux/windows/every_backend.h"
 
+#include "platform/linux/windows/cosmic/cosmic.h"
 #include "platform/linux/windows/gnome/gnome.h"
 #include "platform/linux/windows/kwin/kwin.h"
 #include "platform/linux/windows/wlr/wlr.h"
@@ -8,7 +9,7 @@
 namespace linux::windows {
 
 std::vector<const Backend*> everyBackend() {
-  return {&wlr::kBackend, &kwin::kBackend, &gnome::kBackend, &x11::kBackend};
+  return {&wlr::kBackend, &kwin::kBackend, &cosmic::kBackend, &gnome::kBackend, &x11::kBackend};
 }
 
 }  // namespace linux::windows
