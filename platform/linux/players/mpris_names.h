@@ -8,8 +8,7 @@
 
 namespace linux::players::mpris {
 
-/// How the bus names of all players begin, without the last dot, and with it.
-inline constexpr const char* kNamespace = "org.mpris.MediaPlayer2";
+/// How the bus names of all players begin.
 inline constexpr std::string_view kPrefix = "org.mpris.MediaPlayer2.";
 
 inline constexpr const char* kPath = "/org/mpris/MediaPlayer2";

@@ -1,20 +1,18 @@
 #include "platform/linux/players/players.h"
 
 #include <algorithm>
-#include <charconv>
 #include <map>
 #include <utility>
 
 #include "platform/linux/players/mpris_names.h"
 #include "platform/linux/system/bus_values.h"
+#include "platform/linux/system/names.h"
 
 namespace linux::players {
 
 namespace {
 
 using system::bus;
-using system::call;
-using system::Callee;
 using system::kQueryLimit;
 using system::Message;
 using system::readDictionary;
@@ -27,10 +25,6 @@ constexpr std::chrono::milliseconds kSettling{500};
 
 /// A player for other players; its status is that of somebody who is on the list already.
 constexpr std::string_view kProxy = "playerctld";
-
-const Callee kBusItself{"org.freedesktop.DBus", 0};
-constexpr const char* kBusPath = "/org/freedesktop/DBus";
-constexpr const char* kBusInterface = "org.freedesktop.DBus";
 
 std::list<Player> sPlayers;
 /// The owner of each name that players have on the bus, without the prefix. A player may have several.
@@ -61,28 +55,12 @@ int takeIntroduction(sd_bus_message* answer, void* context, sd_bus_error*) {
   return 0;
 }
 
-int takeProcess(sd_bus_message* answer, void* context, sd_bus_error*) {
-  Player& player = *static_cast<Player*>(context);
-  std::uint32_t process = 0;
-  sd_bus_message_read(answer, "u", &process);
-  player.callee.process = static_cast<pid_t>(process);
-  player.processIsKnown = true;
-  sChanged = true;
-  return 0;
-}
-
 /// Asks who it is, for as long as the player is there: one that is stopped answers when it is continued.
 void introduce(Player& player) {
   Message request = system::makeCall(player.callee, {mpris::kPath, mpris::kPropertiesInterface, "GetAll"});
   if (request == nullptr || sd_bus_message_append(request.get(), "s", mpris::kRootInterface) < 0) return;
   player.introducing = system::callLater(std::move(request), takeIntroduction, &player);
   if (player.introducing != nullptr) player.introduction = Introduction::Awaited;
-}
-
-void findProcess(Player& player) {
-  Message request = system::makeCall(kBusItself, {kBusPath, kBusInterface, "GetConnectionUnixProcessID"});
-  if (request == nullptr || sd_bus_message_append(request.get(), "s", player.callee.name.c_str()) < 0) return;
-  player.findingProcess = system::callLater(std::move(request), takeProcess, &player);
 }
 
 void arrive(const std::string& name, const std::string& owner) {
@@ -92,7 +70,7 @@ void arrive(const std::string& name, const std::string& owner) {
   player.name = name;
   player.callee = {owner, 0};
   sChanged = true;
-  findProcess(player);
+  system::processOf(owner);
   introduce(player);
 }
 
@@ -111,24 +89,17 @@ void leave(const std::string& name) {
   }
 }
 
-/// The part of a player's name after the prefix; empty for other names, and for the proxy's.
-std::string playerName(std::string_view busName) {
-  if (!busName.starts_with(mpris::kPrefix)) return {};
-  busName.remove_prefix(mpris::kPrefix.size());
-  return busName != kProxy ? std::string(busName) : std::string();
+bool isPlayer(std::string_view name) {
+  return name.starts_with(mpris::kPrefix) && name.substr(mpris::kPrefix.size()) != kProxy;
 }
 
-int takeOwnerChange(sd_bus_message* signal, void*, sd_bus_error*) {
-  const char* name = nullptr;
-  const char* before = nullptr;
-  const char* after = nullptr;
-  if (sd_bus_message_read(signal, "sss", &name, &before, &after) <= 0) return 0;
-  const std::string player = playerName(name);
-  if (player.empty()) return 0;
-  if (*before != '\0') leave(player);
-  if (*after != '\0') arrive(player, after);
-  return 0;
+void takeOwnerChange(const std::string& name, const std::string& before, const std::string& after) {
+  const std::string player = name.substr(mpris::kPrefix.size());
+  if (!before.empty()) leave(player);
+  if (!after.empty()) arrive(player, after);
 }
+
+constexpr system::NameFollower kFollower{isPlayer, takeOwnerChange};
 
 /// A status that comes while another one is wished for is from before the command.
 void takeStatus(Player& player, PlaybackStatus status) {
@@ -159,55 +130,32 @@ int takePropertyChange(sd_bus_message* signal, void*, sd_bus_error*) {
   return 0;
 }
 
-/// Connections are numbered as they come to the bus.
-std::uint64_t numberOf(const std::string& uniqueName) {
-  std::uint64_t number = 0;
-  const std::size_t dot = uniqueName.rfind('.');
-  if (dot != std::string::npos) {
-    std::from_chars(uniqueName.data() + dot + 1, uniqueName.data() + uniqueName.size(), number);
-  }
-  return number;
-}
-
-void findPlayers() {
-  const Message answer = call(kBusItself, {kBusPath, kBusInterface, "ListNames"}, kQueryLimit, "");
-  if (answer == nullptr || sd_bus_message_enter_container(answer.get(), SD_BUS_TYPE_ARRAY, "s") <= 0) return;
-  std::vector<std::pair<std::string, std::string>> found;
-  while (const auto name = readText(answer.get(), "s")) {
-    const std::string player = playerName(*name);
-    if (player.empty()) continue;
-    const Message owner =
-        call(kBusItself, {kBusPath, kBusInterface, "GetNameOwner"}, kQueryLimit, "s", name->c_str());
-    const char* uniqueName = nullptr;
-    if (owner == nullptr || sd_bus_message_read(owner.get(), "s", &uniqueName) <= 0) continue;
-    found.emplace_back(player, uniqueName);
-  }
-  std::sort(found.begin(), found.end(), [](const auto& a, const auto& b) {
-    return std::pair(numberOf(a.second), a.first) < std::pair(numberOf(b.second), b.first);
-  });
-  for (const auto& [name, owner] : found) arrive(name, owner);
-}
-
 void beginAnew() {
   sChanged = sChanged || !sPlayers.empty();
   sPlayers.clear();
   sOwners.clear();
   sGeneration = system::busGeneration();
   if (bus() == nullptr) return;
-  const std::string arrivals = std::string("type='signal',sender='org.freedesktop.DBus',") +
-                               "interface='org.freedesktop.DBus',member='NameOwnerChanged'," +
-                               "arg0namespace='" + mpris::kNamespace + "'";
   const std::string changes = std::string("type='signal',path='") + mpris::kPath + "',interface='" +
                               mpris::kPropertiesInterface + "',member='PropertiesChanged',arg0='" +
                               mpris::kPlayerInterface + "'";
-  sd_bus_add_match_async(bus(), nullptr, arrivals.c_str(), takeOwnerChange, nullptr, nullptr);
   sd_bus_add_match_async(bus(), nullptr, changes.c_str(), takePropertyChange, nullptr, nullptr);
-  findPlayers();
+  system::followNames(kFollower);
+}
+
+/// False while the bus has not answered.
+bool learnProcess(Player& player) {
+  const auto process = system::processOf(player.callee.name);
+  if (process.value_or(0) != player.callee.process) {
+    player.callee.process = *process;
+    sChanged = true;
+  }
+  return player.processIsKnown = player.processIsKnown || process.has_value();
 }
 
 bool anyAwaited() {
-  return std::any_of(sPlayers.begin(), sPlayers.end(), [](const Player& player) {
-    return player.introduction == Introduction::Awaited || !player.processIsKnown;
+  return std::any_of(sPlayers.begin(), sPlayers.end(), [](Player& player) {
+    return !learnProcess(player) || player.introduction == Introduction::Awaited;
   });
 }
 

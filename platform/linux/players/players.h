@@ -53,8 +53,8 @@ struct Player {
   std::uint64_t lastPlayed = 0;
   /// Of the program that it is known to be.
   Quirks quirks = kNoQuirk;
-  /// For the answers that it owes: who it is, its process, to the last command that was not waited for.
-  system::Slot introducing, findingProcess, commanding;
+  /// For the answers that it owes: who it is, to the last command that was not waited for.
+  system::Slot introducing, commanding;
 };
 
 /// Counts, from 1, what is done to players and by them, so that the later of two can be told.
