@@ -11,7 +11,8 @@
 // - ignores=METHOD: answers and does nothing; refuses=, dies=, and to end all these obeys=. For Set the
 // property, for mpv's channel the command
 // - holds=METHOD: answers when it is told: answers
-// - win.NAME=BOOLEAN: the state of a GTK action, at the path /win/TITLE
+// - win.NAME=BOOLEAN: the state of a GTK action, at the path /win/TITLE; or that it is disabled, or none
+// - windows=NAME,NAME…: the objects of its windows; windows= for none
 // - hears=INTERFACE: tells of its signals
 // - channel=FILE: listens there and speaks like mpv, or like VLC where its executable is called vlc
 // - rc.title=0/3: what VLC answers to "title"; rc.chapter likewise
@@ -203,6 +204,14 @@ void obey(const std::string& method, const std::vector<std::string>& arguments) 
   }
 }
 
+/// As GTK tells of them.
+std::string windowObjects() {
+  std::string told = "<node>";
+  std::istringstream names(note("windows"));
+  for (std::string name; std::getline(names, name, ',');) told += "<node name=\"" + name + "\"/>";
+  return told + "</node>";
+}
+
 void answer(sd_bus_message* call) {
   const std::string method = sd_bus_message_get_member(call);
   const std::vector<std::string> arguments = argumentsOf(call);
@@ -212,10 +221,11 @@ void answer(sd_bus_message* call) {
   sd_bus_message_new_method_return(call, &reply);
   if (method == "GetAll") appendAll(reply, arguments.at(0));
   if (method == "Get") appendVariant(reply, property(arguments.at(1)));
+  if (method == "Introspect") sd_bus_message_append(reply, "s", windowObjects().c_str());
   if (method == "Notify") sd_bus_message_append(reply, "u", 7);
   if (method == "Describe") {
-    const int state = note("win." + arguments.at(0)) == "true" ? 1 : 0;
-    sd_bus_message_append(reply, "(bgav)", 1, "", 1, "b", state);
+    const std::string state = note("win." + arguments.at(0));
+    sd_bus_message_append(reply, "(bgav)", state != "disabled", "", 1, "b", state == "true");
   }
   sd_bus_send(bus, reply, nullptr);
   sd_bus_message_unref(reply);
@@ -228,7 +238,8 @@ std::string textOf(sd_bus_message* call) {
   if (text == "Set") words.erase(words.begin());
   if (sd_bus_message_get_interface(call) == std::string_view("org.gtk.Actions")) {
     words.front().insert(0, "win.");
-    words.push_back("of " + std::string(sd_bus_message_get_path(call)).substr(5));
+    const std::string path = sd_bus_message_get_path(call);
+    words.push_back("of " + path.substr(path.rfind('/') + 1));
   }
   for (const std::string& word : words) text += word.empty() ? "" : " " + word;
   return text;
@@ -243,15 +254,17 @@ int onMessage(sd_bus_message* call, void*, sd_bus_error*) {
   // Whoever waits for the answer has written to the channel before, if at all.
   if (sd_bus_message_get_expect_reply(call) > 0) serveLines(talk);
   const std::string member = sd_bus_message_get_member(call);
-  const bool question = member == "Get" || member == "GetAll" || member == "Describe";
+  const bool question =
+      member == "Get" || member == "GetAll" || member == "Describe" || member == "Introspect";
   std::uint64_t serial = 0;
   sd_bus_message_get_cookie(call, &serial);
   if (!question || notes.contains("counts")) tell(serial, textOf(call));
   const std::string reaction = note(member == "Set" ? argumentsOf(call).at(1) : member);
+  const bool lacksIt = member == "Describe" && note("win." + argumentsOf(call).at(0)) == "none";
   if (reaction == "dies") std::exit(0);
   if (reaction == "holds") {
     held.push_back(sd_bus_message_ref(call));
-  } else if (reaction == "refuses") {
+  } else if (reaction == "refuses" || lacksIt) {
     sd_bus_reply_method_errorf(call, SD_BUS_ERROR_FAILED, "this is not done here");
   } else {
     answer(call);
@@ -333,6 +346,7 @@ const std::map<std::string_view, std::function<void(Value)>> kWords{
     {"obeys", [](Value method) { notes.erase(method); }},
     {"hears", hear},
     {"answers", [](Value) { answerHeld(); }},
+    {"windows", [](Value names) { notes["windows"] = names; }},
     {"channel", [](Value file) { listenForLines(std::string(std::getenv("XDG_RUNTIME_DIR")) + "/" + file); }},
 };
 

@@ -64,6 +64,8 @@ constexpr OwnWord kOwnWords[] = {
     {words::kReturn, "key Return", "key code 36"},
     {words::kSpace, "key Space", "key code 49"},
     {words::kEscape, "key Escape", "key code 53"},
+    {words::kRight, "key Right", "key code 124"},
+    {words::kLeft, "key Left", "key code 123"},
     {words::kCommandEscape, "key Command+Escape", "key code 53 using command down"},
     {words::kNextAlbum, "`select` the next album", "select album 7"},
     {words::kPreviousAlbum, "`select` the previous album", "select album 5"},
@@ -158,13 +160,17 @@ void startFor(const Chapter& chapter, const Row& row, bool shows) {
   fake::writeEntry(entry, {std::string("X-Kvd-Application=") + bundleIdentifier(chapter.role)});
   Lines words{"playing", "url=dvd:///dev/sr0", "rc.title=1/3", "rc.chapter=1/9", "win.fullscreen=false"};
   words.push_back(std::string("DesktopEntry=") + program.entry);
-  if (*program.busName != '\0')
+  const bool byMethod = row.text.starts_with("`");
+  if (byMethod) words.push_back("windows=1");
+  if (*program.busName != '\0' && !byMethod)
     words.push_back(std::string("owns=org.mpris.MediaPlayer2.") + program.busName);
   if (row.text.find(": `") != std::string::npos) words.push_back("channel=channel");
-  if (shows && *program.showAction != '\0') words.push_back(std::string(program.showAction) + "=true");
+  std::string state = shows ? "true" : program.show == ShowStyle::OwnWindow ? "none" : "false";
+  if (shows && program.show == ShowStyle::ActionDisabled) state = "disabled";
+  if (*program.showAction != '\0') words.push_back(program.showAction + ("=" + state));
   for (const Action& action : program.actions) {
     const std::string how = action.how;
-    if (row.text.starts_with("`") && action.means == Means::Method)
+    if (byMethod && action.means == Means::Method)
       words.push_back("owns=" + how.substr(0, how.find('%')) + "$PID");
   }
   if (scriptFor(chapter, row).find("get ") != std::string::npos) words.push_back("counts");

@@ -1,9 +1,12 @@
 #include "platform/linux/players/gtk_actions.h"
 
+#include <algorithm>
+#include <charconv>
 #include <string>
 #include <string_view>
 
 #include "platform/linux/system/bus.h"
+#include "platform/linux/system/introspection.h"
 
 namespace linux::players {
 
@@ -20,6 +23,17 @@ struct Address {
   std::string action;
 };
 
+/// The object of the newest window, whose number is the highest; empty when there is none.
+std::string newestWindow(const system::Callee& callee, const std::string& path) {
+  unsigned newest = 0;
+  for (const std::string& child : system::childrenOf(callee, path.substr(0, path.size() - 1).c_str())) {
+    unsigned number = 0;
+    std::from_chars(child.data(), child.data() + child.size(), number);
+    newest = std::max(newest, number);
+  }
+  return newest != 0 ? path + std::to_string(newest) : std::string();
+}
+
 /// Programs write what they like into their windows' properties: only a unique name and a well-formed path
 /// are used.
 std::optional<Address> addressOf(const windows::Window& window, std::string_view action) {
@@ -31,8 +45,26 @@ std::optional<Address> addressOf(const windows::Window& window, std::string_view
   address.action = action.substr(kOfWindow.size());
   const std::string& name = address.callee.name;
   if (!name.starts_with(':') || sd_bus_service_name_is_valid(name.c_str()) <= 0) return std::nullopt;
+  if (address.path.ends_with('/')) address.path = newestWindow(address.callee, address.path);
   if (sd_bus_object_path_is_valid(address.path.c_str()) <= 0) return std::nullopt;
   return address;
+}
+
+std::optional<ActionDescription> describe(const Address& address) {
+  const system::Message answer = system::call(address.callee, {address.path.c_str(), kInterface, "Describe"},
+                                              system::kQueryLimit, "s", address.action.c_str());
+  int enabled = 0;
+  int state = 0;
+  if (answer == nullptr || sd_bus_message_enter_container(answer.get(), 'r', "bgav") <= 0 ||
+      sd_bus_message_read(answer.get(), "b", &enabled) <= 0 || sd_bus_message_skip(answer.get(), "g") < 0) {
+    return std::nullopt;
+  }
+  ActionDescription told{enabled != 0, std::nullopt};
+  if (sd_bus_message_enter_container(answer.get(), 'a', "v") > 0 &&
+      sd_bus_message_read(answer.get(), "v", "b", &state) > 0) {
+    told.state = state != 0;
+  }
+  return told;
 }
 
 bool activate(const Address& address) {
@@ -52,25 +84,14 @@ bool activateAction(const windows::Window& window, const char* action) {
   const std::string_view text = action;
   const std::size_t sign = text.find('=');
   const auto address = addressOf(window, text.substr(0, sign));
-  if (!address) return false;
+  if (!address || !describe(*address)) return false;
   return sign == std::string_view::npos ? activate(*address)
                                         : setState(*address, text.substr(sign + 1) == "true");
 }
 
-std::optional<bool> actionState(const windows::Window& window, const char* action) {
+std::optional<ActionDescription> describeAction(const windows::Window& window, const char* action) {
   const auto address = addressOf(window, action);
-  if (!address) return std::nullopt;
-  const system::Message answer =
-      system::call(address->callee, {address->path.c_str(), kInterface, "Describe"}, system::kQueryLimit, "s",
-                   address->action.c_str());
-  int state = 0;
-  if (answer == nullptr || sd_bus_message_enter_container(answer.get(), 'r', "bgav") <= 0 ||
-      sd_bus_message_skip(answer.get(), "bg") < 0 ||
-      sd_bus_message_enter_container(answer.get(), 'a', "v") <= 0 ||
-      sd_bus_message_read(answer.get(), "v", "b", &state) <= 0) {
-    return std::nullopt;
-  }
-  return state != 0;
+  return address ? describe(*address) : std::nullopt;
 }
 
 }  // namespace linux::players

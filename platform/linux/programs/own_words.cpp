@@ -13,10 +13,9 @@ struct KeyWord {
 };
 
 constexpr KeyWord kKeyWords[] = {
-    {kShiftS, HostVirtualKey::S, true},
-    {kReturn, HostVirtualKey::Return, false},
-    {kSpace, HostVirtualKey::Space, false},
-    {kEscape, HostVirtualKey::Escape, false},
+    {kShiftS, HostVirtualKey::S, true},          {kReturn, HostVirtualKey::Return, false},
+    {kSpace, HostVirtualKey::Space, false},      {kEscape, HostVirtualKey::Escape, false},
+    {kRight, HostVirtualKey::RightArrow, false}, {kLeft, HostVirtualKey::LeftArrow, false},
 };
 
 }  // namespace

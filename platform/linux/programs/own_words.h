@@ -15,6 +15,8 @@ inline constexpr Code kShiftS = code("k S ");
 inline constexpr Code kReturn = code("kRtn");
 inline constexpr Code kSpace = code("kSpc");
 inline constexpr Code kEscape = code("kEsc");
+inline constexpr Code kRight = code("kRgt");
+inline constexpr Code kLeft = code("kLft");
 inline constexpr Code kCommandEscape = code("kCEs");
 
 /// The two directions in which albums are walked.

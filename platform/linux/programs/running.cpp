@@ -11,6 +11,7 @@
 
 #include "platform/base/run_loop.h"
 #include "platform/linux/players/mpris.h"
+#include "platform/linux/programs/connections.h"
 #include "platform/linux/system/process.h"
 #include "platform/tarnscript/tarnscript.h"
 #include "platform/text/case.h"
@@ -93,6 +94,24 @@ void dropExtensions(std::vector<Instance>& found) {
   });
 }
 
+/// Makes sure that every program is there that has windows on the bus.
+void addConnections(std::vector<Instance>& found) {
+  for (const Connection& connection : connections()) {
+    const pid_t process = connection.callee.process;
+    auto instance = std::ranges::find_if(
+        found, [&](const Instance& each) { return process != 0 && each.process == process; });
+    if (instance == found.end()) {
+      Window window;
+      window.applicationID = connection.program->entry;
+      Casting casting = castWindow(window);
+      if (casting.role == Role::None) continue;
+      instance = found.insert(found.end(), instanceOf(std::move(casting)));
+      instance->process = process;
+    }
+    instance->connection = connection.callee.name;
+  }
+}
+
 /// Whether the window is named after what the player plays.
 bool isNamedAfter(const Window& window, const Instance& instance) {
   Player* const player = playerOf(instance);
@@ -110,7 +129,8 @@ bool isNamedAfter(const Window& window, const Instance& instance) {
 Instance* ownerByEntry(std::vector<Instance>& found, const Window& window, const Casting& casting) {
   const auto fits = [&](const Instance& instance) {
     if (instance.entry.empty() || instance.entry != casting.entry || anyBelongsTo(instance)) return false;
-    return !instance.owner.empty() || (instance.process == 0 && window.process == 0);
+    return !instance.owner.empty() || !instance.connection.empty() ||
+           (instance.process == 0 && window.process == 0);
   };
   std::vector<Instance*> owners;
   for (Instance& instance : found) {
@@ -145,7 +165,7 @@ void addPrograms(std::vector<Instance>& found) {
 /// What tells a program apart whose process nobody knows.
 std::uint32_t numberWithoutProcess(const Instance& instance) {
   if (!instance.windows.empty()) return static_cast<std::uint32_t>(instance.windows.front().number);
-  return static_cast<std::uint32_t>(std::hash<std::string>()(instance.owner));
+  return static_cast<std::uint32_t>(std::hash<std::string>()(instance.owner + instance.connection));
 }
 
 void addWindows(std::vector<Instance>& found) {
@@ -162,10 +182,11 @@ void addWindows(std::vector<Instance>& found) {
 }
 
 bool sameList(const std::vector<Instance>& a, const std::vector<Instance>& b) {
-  return std::is_permutation(
-      a.begin(), a.end(), b.begin(), b.end(), [](const Instance& x, const Instance& y) {
-        return x.role == y.role && x.serialNumber == y.serialNumber && x.owner == y.owner;
-      });
+  return std::is_permutation(a.begin(), a.end(), b.begin(), b.end(),
+                             [](const Instance& x, const Instance& y) {
+                               return x.role == y.role && x.serialNumber == y.serialNumber &&
+                                      x.owner == y.owner && x.connection == y.connection;
+                             });
 }
 
 /// Looks once a turn, as nothing tells, whether windows of a suite have another document in them. True when
@@ -215,16 +236,18 @@ const Instance* firstOfThisTurn(Role role) {
 
 void takeInDesktop() {
   const bool playersChanged = players::takeInPlayers();
+  const bool connectionsChanged = takeInConnections();
   const bool windowsChanged = windows::takeIn();
   if (windowsChanged) {
     sWindows = windows::list();
     sClassesRead = base::turn();
   }
   const bool classesChanged = readChangingClasses();
-  if (!playersChanged && !windowsChanged && !classesChanged) return;
+  if (!playersChanged && !connectionsChanged && !windowsChanged && !classesChanged) return;
   std::vector<Instance> found;
   addPlayers(found);
   dropExtensions(found);
+  addConnections(found);
   addPrograms(found);
   addWindows(found);
   for (Instance& instance : found) {

@@ -1,4 +1,5 @@
-// The programs that run and play a role: owners of MPRIS2 names and of windows, merged.
+// The programs that run and play a role: owners of MPRIS2 names, of windows, and of windows that
+// the bus alone tells of, merged.
 //
 // What the bus knows and what the window systems know of one program meet by its process; where that is
 // hidden, by its desktop entry.
@@ -30,6 +31,8 @@ struct Instance {
   HostProcessSerialNumber serialNumber;
   /// Its player on the bus, by unique name; empty when it has none.
   std::string owner;
+  /// Its connection that has its windows, by unique name; empty when it has none.
+  std::string connection;
   /// Its windows, topmost first.
   std::vector<windows::ID> windows;
   /// When it was last told to do something, as players::nextUse counts; 0 for never.

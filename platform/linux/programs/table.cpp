@@ -101,25 +101,37 @@ constexpr Program kPrograms[] = {
     {.role = Role::ModernMovies, .name = "Plasma Browser Integration", .busName = "plasma-browser-integration", .quirks = kBrowser | kSpeaksForBrowser, .actions = {{{movies::kClose, Means::Mpris, "Pause"}}}},
 
     {.role = Role::Presentation, .name = "LibreOffice Impress", .entry = "libreoffice-impress", .windowClass = "libreoffice-impress", .show = ShowStyle::OwnWindow, .suite = "libreoffice"},
-    {.role = Role::Presentation, .name = "Evince", .entry = "org.gnome.Evince", .windowClass = "evince",
+    {.role = Role::Presentation, .name = "Evince", .entry = "org.gnome.Evince", .windowClass = "evince", .executable = "evince", .windowsAt = "/org/gnome/Evince/window",
      .actions = {{
          {slidewell::kStart, Means::Action, "win.presentation"},
          {slidewell::kStart, Means::Key, "F5"},
+         {slidewell::kStop, Means::Action, "win.escape"},
+         {slidewell::kStop, Means::Key, "Escape"},
      }}},
-    {.role = Role::Presentation, .name = "Papers", .entry = "org.gnome.Papers", .windowClass = "papers",
+    {.role = Role::Presentation, .name = "Papers", .entry = "org.gnome.Papers", .windowClass = "papers", .executable = "papers", .windowsAt = "/org/gnome/Papers/window", .show = ShowStyle::ActionDisabled, .showAction = "win.fullscreen",
      .actions = {{
          {slidewell::kStart, Means::Action, "win.presentation"},
          {slidewell::kStop, Means::Action, "win.escape"},
      }}},
     {.role = Role::Presentation, .name = "Atril", .entry = "atril", .windowClass = "atril"},
-    {.role = Role::Presentation, .name = "Okular", .entry = "org.kde.okular", .windowClass = "okular", .show = ShowStyle::OwnWindow,
+    {.role = Role::Presentation, .name = "Okular", .entry = "org.kde.okular", .windowClass = "okular", .executable = "okular", .windowsAt = "/okular", .show = ShowStyle::OwnWindow,
      .actions = {{
          {slidewell::kStart, Means::Method, "org.kde.okular-% /okular org.kde.okular slotTogglePresentation"},
          {slidewell::kStart, Means::Key, "Control+Shift+p"},
+         {slidewell::kStop, Means::Method, "org.kde.okular-% /okular org.kde.okular slotTogglePresentation"},
+         {slidewell::kStop, Means::Key, "Escape"},
+         {slidewell::kShowNext, Means::Method, "org.kde.okular-% /okular org.kde.okular slotNextPage"},
+         {slidewell::kShowNext, Means::Key, "Right"},
+         {slidewell::kShowPrevious, Means::Method, "org.kde.okular-% /okular org.kde.okular slotPreviousPage"},
+         {slidewell::kShowPrevious, Means::Key, "Left"},
+         {words::kFirstSlide, Means::Method, "org.kde.okular-% /okular org.kde.okular slotGotoFirst"},
+         {words::kFirstSlide, Means::Key, "Home"},
+         {words::kLastSlide, Means::Method, "org.kde.okular-% /okular org.kde.okular slotGotoLast"},
+         {words::kLastSlide, Means::Key, "End"},
          {words::kThaw, Means::Key, "b"},
      }}},
 
-    {.role = Role::PhotoLibrary, .name = "Eye of GNOME", .entry = "org.gnome.eog", .windowClass = "eog", .show = ShowStyle::ActionState, .showAction = "win.view-slideshow",
+    {.role = Role::PhotoLibrary, .name = "Eye of GNOME", .entry = "org.gnome.eog", .windowClass = "eog", .executable = "eog", .windowsAt = "/org/gnome/eog/window", .show = ShowStyle::ActionState, .showAction = "win.view-slideshow",
      .actions = {{
          {snapvale::kStartSlideshow, Means::Action, "win.view-slideshow=true"},
          {snapvale::kStartSlideshow, Means::Key, "F5"},
@@ -129,28 +141,53 @@ constexpr Program kPrograms[] = {
          {words::kNextAlbum, Means::Key, "Right"},
          {words::kPreviousAlbum, Means::Action, "win.go-previous"},
          {words::kPreviousAlbum, Means::Key, "Left"},
+         {words::kRight, Means::Action, "win.go-next"},
+         {words::kRight, Means::Key, "Right"},
+         {words::kLeft, Means::Action, "win.go-previous"},
+         {words::kLeft, Means::Key, "Left"},
          {words::kSpace, Means::Action, "win.pause-slideshow"},
          {words::kSpace, Means::Key, "p"},
+         {words::kEscape, Means::Action, "win.view-slideshow=false"},
+         {words::kEscape, Means::Key, "Escape"},
          {words::kCommandEscape, Means::Action, "win.view-fullscreen"},
          {words::kCommandEscape, Means::Key, "F11"},
      }}},
-    {.role = Role::PhotoLibrary, .name = "gThumb", .entry = "org.gnome.gThumb", .windowClass = "gthumb", .show = ShowStyle::OwnWindow,
+    {.role = Role::PhotoLibrary, .name = "gThumb", .entry = "org.gnome.gThumb", .windowClass = "gthumb", .executable = "gthumb", .windowsAt = "/org/gnome/gThumb/window", .show = ShowStyle::OwnWindow, .showAction = "win.slideshow-close",
      .actions = {{
          {snapvale::kStartSlideshow, Means::Action, "win.slideshow"},
+         {snapvale::kStopSlideshow, Means::Action, "win.slideshow-close"},
+         {snapvale::kStopSlideshow, Means::Key, "Escape"},
          {words::kNextAlbum, Means::Action, "win.show-next-image"},
          {words::kPreviousAlbum, Means::Action, "win.show-previous-image"},
+         {words::kRight, Means::Action, "win.slideshow-next-image"},
+         {words::kLeft, Means::Action, "win.slideshow-previous-image"},
+         {words::kSpace, Means::Action, "win.slideshow-toggle-pause"},
+         {words::kEscape, Means::Action, "win.slideshow-close"},
+         {words::kEscape, Means::Key, "Escape"},
          {words::kCommandEscape, Means::Action, "win.fullscreen"},
      }}},
-    {.role = Role::PhotoLibrary, .name = "Gwenview", .entry = "org.kde.gwenview", .busName = "Gwenview", .windowClass = "gwenview",
+    {.role = Role::PhotoLibrary, .name = "Gwenview", .entry = "org.kde.gwenview", .busName = "Gwenview", .windowClass = "gwenview", .executable = "gwenview", .windowsAt = "/gwenview",
      .actions = {{
          {snapvale::kStartSlideshow, Means::Mpris, "Play"},
+         {snapvale::kStartSlideshow, Means::Method, "% /gwenview/MainWindow_1 org.kde.KMainWindow activateAction toggle_slideshow"},
          {snapvale::kStopSlideshow, Means::Mpris, "Stop"},
+         {snapvale::kStopSlideshow, Means::Method, "% /gwenview/MainWindow_1 org.kde.KMainWindow activateAction leave_fullscreen"},
          {words::kNextAlbum, Means::Mpris, "Next"},
+         {words::kNextAlbum, Means::Method, "% /gwenview/MainWindow_1 org.kde.KMainWindow activateAction go_next"},
          {words::kPreviousAlbum, Means::Mpris, "Previous"},
+         {words::kPreviousAlbum, Means::Method, "% /gwenview/MainWindow_1 org.kde.KMainWindow activateAction go_previous"},
+         {words::kRight, Means::Mpris, "Next"},
+         {words::kRight, Means::Method, "% /gwenview/MainWindow_1 org.kde.KMainWindow activateAction go_next"},
+         {words::kLeft, Means::Mpris, "Previous"},
+         {words::kLeft, Means::Method, "% /gwenview/MainWindow_1 org.kde.KMainWindow activateAction go_previous"},
          {words::kSpace, Means::Mpris, "PlayPause"},
+         {words::kSpace, Means::Method, "% /gwenview/MainWindow_1 org.kde.KMainWindow activateAction toggle_slideshow"},
      }}},
     {.role = Role::PhotoLibrary, .name = "Shotwell", .entry = "org.gnome.Shotwell", .windowClass = "shotwell"},
-    {.role = Role::PhotoLibrary, .name = "Loupe", .entry = "org.gnome.Loupe", .windowClass = "org.gnome.Loupe"},
+    {.role = Role::PhotoLibrary, .name = "Loupe", .entry = "org.gnome.Loupe", .windowClass = "org.gnome.Loupe", .executable = "loupe", .windowsAt = "/org/gnome/Loupe/window",
+     .actions = {{
+         {snapvale::kStartSlideshow, Means::Key, "F11"},
+     }}},
 
     {.role = Role::ProfessionalPhotos, .name = "darktable", .entry = "org.darktable.darktable", .windowClass = "darktable",
      .actions = {{
@@ -253,6 +290,13 @@ const Program* programByBusName(std::string_view busName) {
 
 const Program* programByWindowClass(std::string_view windowClass) {
   return programBy(&Program::windowClass, windowClass);
+}
+
+const Program* programByExecutable(std::string_view executable) {
+  const auto* const found = std::find_if(std::begin(kPrograms), std::end(kPrograms), [&](const Program& row) {
+    return *row.windowsAt != '\0' && row.executable == executable;
+  });
+  return found != std::end(kPrograms) ? found : nullptr;
 }
 
 bool isOfSuite(std::string_view windowClass) {

@@ -19,9 +19,9 @@ enum class Means : std::uint8_t {
   Mpris,    ///< a method of org.mpris.MediaPlayer2.Player, without arguments
   Channel,  ///< a command for the program's channel
   Action,   ///< a GTK action of its window or application ("win.presentation", "app.quit=true")
-  Method,   ///< a method of its own on the bus, without arguments: name, path, interface, member; '%' is its
-            ///< pid
-  Key,      ///< keys for its window ("F5", "Shift+m", "Escape F11")
+  Method,  ///< a method of its own on the bus: name, path, interface, member and at most one text; '%' in the
+           ///< name is its pid, and alone its connection
+  Key,     ///< keys for its window ("F5", "Shift+m", "Escape F11")
   Nothing,  ///< succeeds and does nothing, because the texts around it do the real work
 };
 
@@ -34,9 +34,10 @@ struct Action {
 
 /// How it is seen that a program shows slides or photos.
 enum class ShowStyle : std::uint8_t {
-  FullScreen,   ///< its window is full screen, by neither win.fullscreen nor a player's Stopped
-  OwnWindow,    ///< a full-screen window stands beside the document's
-  ActionState,  ///< the state of a GTK action tells, and where it cannot be asked, the full screen
+  FullScreen,      ///< its window is full screen, by neither win.fullscreen nor a player's Stopped
+  OwnWindow,       ///< a full-screen window stands beside the document's, or a window has the show's action
+  ActionState,     ///< the state of a GTK action tells, and where it cannot be asked, the full screen
+  ActionDisabled,  ///< the same, by a GTK action that is disabled meanwhile
 };
 
 /// A well-known program. Empty texts are what it does not have.
@@ -53,16 +54,18 @@ struct Program {
   const char* windowClass = "";
   players::Quirks quirks = players::kNoQuirk;
   players::ChannelKind channel = players::ChannelKind::None;
-  /// The name of the file that it runs: who opens the channel, or takes the remote.
+  /// The name of the file that it runs: who opens the channel, takes the remote, or has windows on the bus.
   const char* executable = "";
+  /// Below which path its windows are on the bus ("/org/gnome/eog/window": 1, 2).
+  const char* windowsAt = "";
   ShowStyle show = ShowStyle::FullScreen;
-  /// The action whose state tells, where one does.
+  /// The action that tells, where one does.
   const char* showAction = "";
   /// Where one process shows the documents of several programs: how the classes of all their windows begin,
   /// which change with the document.
   const char* suite = "";
   /// Several for one word are tried in order; the first whose way is open counts.
-  std::array<Action, 14> actions{};
+  std::array<Action, 18> actions{};
 };
 
 std::span<const Program> programs();
@@ -72,6 +75,9 @@ std::span<const Program> programs();
 const Program* programByEntry(std::string_view entry);
 const Program* programByBusName(std::string_view busName);
 const Program* programByWindowClass(std::string_view windowClass);
+
+/// The program with windows on the bus that this executable runs; null when there is none.
+const Program* programByExecutable(std::string_view executable);
 
 /// Whether windows of this class change it with the document in them.
 bool isOfSuite(std::string_view windowClass);

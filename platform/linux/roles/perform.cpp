@@ -15,17 +15,20 @@ namespace {
 
 using programs::Means;
 
-/// Calls "NAME PATH INTERFACE MEMBER", where '%' in the name stands for the process. False when nobody has
-/// that name.
-bool callMethod(pid_t process, const std::string& how) {
+/// Calls "NAME PATH INTERFACE MEMBER TEXT", as Means::Method tells. False when nobody has that name.
+bool callMethod(const programs::Instance& instance, const std::string& how) {
   std::istringstream words(how);
-  std::string name, path, interface, member;
-  words >> name >> path >> interface >> member;
-  if (const std::size_t at = name.find('%'); at != std::string::npos) {
-    name.replace(at, 1, std::to_string(process));
+  std::string name, path, interface, member, argument;
+  words >> name >> path >> interface >> member >> argument;
+  const std::size_t at = name.find('%');
+  if (name == "%") {
+    name = instance.connection;
+  } else if (at != std::string::npos) {
+    name.replace(at, 1, std::to_string(instance.process));
   }
-  return system::nameHasOwner(name.c_str()) &&
-         system::send({name, process}, {path.c_str(), interface.c_str(), member.c_str()}, "");
+  if (name.empty() || !system::nameHasOwner(name.c_str())) return false;
+  return system::send({name, instance.process}, {path.c_str(), interface.c_str(), member.c_str()},
+                      argument.empty() ? "" : "s", argument.c_str());
 }
 
 /// False when the action's way is not open on this program.
@@ -46,7 +49,7 @@ bool carryOut(const programs::Action& action, const Performer& performer) {
       window = performer.keyboardWindow();
       return window != nullptr && players::activateAction(*window, action.how);
     case Means::Method:
-      return callMethod(performer.instance().process, action.how);
+      return callMethod(performer.instance(), action.how);
     case Means::Key:
       window = performer.keyboardWindow();
       return window != nullptr && windows::type(window->id, action.how);

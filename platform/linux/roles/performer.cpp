@@ -1,5 +1,6 @@
 #include "platform/linux/roles/performer.h"
 
+#include "platform/linux/programs/connections.h"
 #include "platform/linux/windows/keystrokes.h"
 #include "platform/tarnscript/tarnscript.h"
 
@@ -24,8 +25,23 @@ system::Listener Performer::listener() const {
 }
 
 const std::vector<windows::Window>& Performer::windows() const {
-  if (!windows_) windows_ = windows::look(instance_->windows);
+  if (!windows_) windows_ = lookAtWindows();
   return *windows_;
+}
+
+std::vector<windows::Window> Performer::lookAtWindows() const {
+  std::vector<windows::Window> looked = windows::look(instance_->windows);
+  if (instance_->connection.empty() || program() == nullptr) return looked;
+  if (looked.empty()) {
+    windows::Window& unseen = looked.emplace_back();
+    unseen.applicationID = program()->entry;
+    unseen.className = program()->windowClass;
+    unseen.process = instance_->process;
+  }
+  for (windows::Window& window : looked) {
+    if (window.gtk.busName.empty()) window.gtk = programs::gtkNamesOf(*program(), instance_->connection);
+  }
+  return looked;
 }
 
 const windows::Window* Performer::keyboardWindow() const { return windows::keyboardWindow(windows()); }

@@ -28,7 +28,8 @@ class Performer {
   /// Who listens on it.
   system::Listener listener() const;
 
-  /// Its windows as they look during this event, topmost first.
+  /// Its windows as they look during this event, topmost first; where the bus alone tells of them one that
+  /// nobody sees, without an id.
   const std::vector<windows::Window>& windows() const;
   /// The one that a person would type into; null when it has none.
   const windows::Window* keyboardWindow() const;
@@ -37,6 +38,8 @@ class Performer {
   Performer in(const windows::Window& window) const;
 
  private:
+  std::vector<windows::Window> lookAtWindows() const;
+
   const programs::Instance* instance_;
   players::Player* player_;
   mutable std::optional<std::vector<windows::Window>> windows_;

@@ -69,7 +69,7 @@ Value PhotoLibrary::performBy(const Performer& performer, const Event& event) {
       break;
     case snapvale::kStopSlideshow:
       if (!showRuns(performer)) return {};
-      break;
+      return RoleApplication::performBy(performer.in(*showWindow(performer)), event);
     case snapvale::kSelect:
       select(performer, event);
       return {};

@@ -1,6 +1,7 @@
 #include "platform/linux/roles/show_window.h"
 
 #include <algorithm>
+#include <optional>
 
 #include "platform/linux/players/gtk_actions.h"
 #include "platform/linux/players/mpris.h"
@@ -30,9 +31,27 @@ bool isStopped(const Performer& performer) {
   return player != nullptr && players::statusOf(*player) == players::PlaybackStatus::Stopped;
 }
 
+/// Whether a show runs, where an action tells.
+std::optional<bool> toldByAction(const Performer& performer, const Window& window) {
+  if (performer.program() == nullptr || *performer.program()->showAction == '\0') return std::nullopt;
+  const auto told = players::describeAction(window, performer.program()->showAction);
+  if (!told) return std::nullopt;
+  switch (styleOf(performer)) {
+    case ShowStyle::ActionState:
+      return told->state;
+    case ShowStyle::ActionDisabled:
+      return !told->isEnabled;
+    default:
+      return true;
+  }
+}
+
 }  // namespace
 
 const Window* showWindow(const Performer& performer) {
+  const Window* const front = performer.keyboardWindow();
+  if (front == nullptr) return nullptr;
+  if (const auto told = toldByAction(performer, *front)) return *told ? front : nullptr;
   const auto& windows = performer.windows();
   const auto show = std::ranges::find_if(
       windows, [](const Window& window) { return window.isFullScreen && window.isShown; });
@@ -44,8 +63,8 @@ const Window* showWindow(const Performer& performer) {
     return another ? &*show : nullptr;
   }
   // GTK programs tell their ordinary full-screen mode.
-  const Window* const front = performer.keyboardWindow();
-  return players::actionState(*front, "win.fullscreen") == true ? nullptr : &*show;
+  const auto fullScreen = players::describeAction(*front, "win.fullscreen");
+  return fullScreen && fullScreen->state == true ? nullptr : &*show;
 }
 
 std::vector<const Window*> documentWindows(const Performer& performer) {
@@ -57,12 +76,6 @@ std::vector<const Window*> documentWindows(const Performer& performer) {
 }
 
 bool showRuns(const Performer& performer) {
-  if (styleOf(performer) == ShowStyle::ActionState) {
-    const Window* const front = performer.keyboardWindow();
-    if (front == nullptr) return false;
-    const auto told = players::actionState(*front, performer.program()->showAction);
-    if (told) return *told;
-  }
   return showWindow(performer) != nullptr && !isStopped(performer);
 }
 

@@ -29,6 +29,7 @@ struct Area {
 };
 
 /// Where on the session bus a GTK window's actions are; as the program wrote it, and empty for all others.
+/// A window path that ends in '/' stands for the newest window below it.
 struct GtkNames {
   std::string busName;
   std::string applicationPath;
