@@ -7,9 +7,9 @@ tap play
   window Cat: activate
   eog: SetState win.view-slideshow true of Cat
 tap next
-  window Cat: key Right
+  eog: Activate win.go-next of Cat
 tap menu
-  window Cat: key Escape
+  eog: SetState win.view-slideshow false of Cat
 # A display is captured by a shown window that covers most of it. Then play is a key, which pauses the show.
 eog: win.view-slideshow=false
 outputs 0,0,1280,720 1280,0,1920,1080

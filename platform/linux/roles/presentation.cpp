@@ -46,7 +46,7 @@ class Presentation final : public RoleApplication {
   Value performBy(const Performer& performer, const Event& event) override;
 
  private:
-  bool isFrozen(const Window* show) const { return show != nullptr && show->id == frozenIn_; }
+  bool isFrozen(const Window* show) const { return show != nullptr && show->id && show->id == frozenIn_; }
   void start(const Performer& performer);
   void stop(const Performer& performer);
   void jump(const Performer& performer, const Event& event);
