@@ -53,7 +53,7 @@ struct Outcome {
 /// For as long as it lives the core's questions are listened to and scripts do nothing.
 class Rehearsal {
  public:
-  explicit Rehearsal(telling::Choice& choice, bool& repeats) {
+  Rehearsal(telling::Choice& choice, bool& repeats) {
     host::setListener({
         .whoIsInFront =
             [&choice](Role front) {
@@ -140,7 +140,7 @@ Object remarksOn(const Outcome& outcome, const Instance* target) {
           "something; this program cannot know that and takes the one that was started last.");
     }
     for (const Instance* other : inRole) {
-      if (other == target || !plays(*other)) continue;
+      if (other == target || outcome.pressed.empty() || !plays(*other)) continue;
       remarks.push_back("Where it begins to play, " + nameOf(*other) + " (" + std::to_string(other->process) +
                         "), which plays too, is paused: one of a kind at a time.");
     }

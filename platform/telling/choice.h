@@ -1,7 +1,6 @@
 // Why a button went where it went, told from what the core asked the host on its way.
 #pragma once
 
-#include <cstddef>
 #include <cstdint>
 #include <functional>
 #include <map>
@@ -29,8 +28,6 @@ class Choice {
   void noteAsked(std::string_view application);
   /// It has chosen this one; empty for none.
   Reason conclude(std::string_view target);
-  /// How many applications it asked about since the choice began.
-  std::size_t askedAbout() const { return asked_.size(); }
 
  private:
   Reason reasonFor(std::string_view target) const;
