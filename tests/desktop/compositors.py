@@ -70,12 +70,25 @@ class Sway(Wlroots):
     def windows(self, *state):
         def below(node):
             has = {"state:active": node["focused"], "state:fullscreen": node.get("fullscreen_mode") == 1}
-            own = [[node["app_id"], node["name"]]] if "pid" in node and all(map(has.get, state)) else []
+            name = node.get("app_id") or node.get("window_properties", {}).get("class")
+            own = [[name, node["name"]]] if "pid" in node and all(map(has.get, state)) else []
             return sum(map(below, node["nodes"]), own)
         return below(self.sway("-t", "get_tree") or {"focused": False, "nodes": []})
 
     def focus(self, title):
         self.sway(f'[title="{title}"] focus')
+
+
+class SwayWithX(Sway):
+    """Starts an X server for programs that want one."""
+
+    def __init__(self):
+        super().__init__()
+        self.write(".config/sway/config", "xwayland enable\nexec echo $DISPLAY >$XDG_RUNTIME_DIR/display\n")
+
+    def start_windows(self):
+        super().start_windows()
+        self.env["DISPLAY"] = wait(lambda: self.read("cat", f"{self.runtime}/display"), "an X server's name")
 
 
 class Labwc(Wlroots):
@@ -249,6 +262,7 @@ class StrictKWin(KWin):
 COMPOSITORS = {
     "gnome": Gnome,
     "sway": Sway,
+    "sway-with-x": SwayWithX,
     "labwc": Labwc,
     "kwin": KWin,
     "strict-kwin": StrictKWin,

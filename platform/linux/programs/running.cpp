@@ -105,6 +105,7 @@ void addConnections(std::vector<Instance>& found) {
       window.applicationID = connection.program->entry;
       Casting casting = castWindow(window);
       if (casting.role == Role::None) continue;
+      if (casting.ground == Ground::DesktopEntry) casting.ground = Ground::Connection;
       instance = found.insert(found.end(), instanceOf(std::move(casting)));
       instance->process = process;
     }

@@ -216,14 +216,13 @@ bool takesKeys(ID window) {
 }
 
 std::vector<Output> outputs() {
-  std::vector<Output> all;
   for (std::uint32_t i = 0; i < sBackends.size(); ++i) {
-    for (Output output : sBackends[i]->outputs()) {
-      output.id = output.id * kMostBackends + i;
-      all.push_back(output);
-    }
+    std::vector<Output> told = sBackends[i]->outputs();
+    if (told.empty()) continue;
+    for (Output& output : told) output.id = output.id * kMostBackends + i;
+    return told;
   }
-  return all;
+  return {};
 }
 
 bool isCaptured(std::uint32_t id) {

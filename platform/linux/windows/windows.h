@@ -15,8 +15,8 @@ namespace linux::windows {
 /// What windows are wanted for.
 enum class Use : std::uint8_t { Looking, Typing };
 
-/// The back ends to be asked from here on; where two know the same, the earlier one is believed. Who only looks
-/// can send no keys, and has no keyboards made.
+/// The back ends to be asked from here on; where two know the same, the earlier one is believed. Who only
+/// looks can send no keys, and has no keyboards made.
 void init(std::vector<const Backend*> backends, Use use = Use::Typing);
 /// Closes them.
 void finish();
@@ -51,7 +51,8 @@ bool sendKey(ID window, std::uint32_t keysym, bool down, Modifiers modifiers);
 /// Whether sendKey would reach the window now.
 bool takesKeys(ID window);
 
-/// The active outputs of all back ends.
+/// The active outputs, by the first back end that tells of any: an X server beside a compositor shows on the
+/// same ones, and does not know what else is there.
 std::vector<Output> outputs();
 
 /// Whether a shown full-screen window covers most of this output.
