@@ -84,7 +84,9 @@ bool activateAction(const windows::Window& window, const char* action) {
   const std::string_view text = action;
   const std::size_t sign = text.find('=');
   const auto address = addressOf(window, text.substr(0, sign));
-  if (!address || !describe(*address)) return false;
+  if (!address) return false;
+  // One that is too busy to answer comes to it.
+  if (!describe(*address) && !system::timedOutThisTurn(address->callee.process)) return false;
   return sign == std::string_view::npos ? activate(*address)
                                         : setState(*address, text.substr(sign + 1) == "true");
 }

@@ -146,7 +146,7 @@ void beginAnew() {
 /// False while the bus has not answered.
 bool learnProcess(Player& player) {
   const auto process = system::processOf(player.callee.name);
-  if (process.value_or(0) != player.callee.process) {
+  if (process && *process != player.callee.process) {
     player.callee.process = *process;
     sChanged = true;
   }

@@ -39,7 +39,9 @@ std::vector<windows::Window> Performer::lookAtWindows() const {
     unseen.process = instance_->process;
   }
   for (windows::Window& window : looked) {
-    if (window.gtk.busName.empty()) window.gtk = programs::gtkNamesOf(*program(), instance_->connection);
+    if (!window.gtk.busName.empty()) continue;
+    window.gtk = programs::gtkNamesOf(*program(), instance_->connection);
+    window.process = instance_->process;
   }
   return looked;
 }
