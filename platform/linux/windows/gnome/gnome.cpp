@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <string>
 #include <utility>
 
 #include "platform/linux/windows/gnome/accessibility.h"
@@ -33,8 +34,16 @@ bool open() {
   }
   sNow = windowsNow();
   for (Window& window : sNow) window.id.backend = &kBackend;
-  if (!sNow.empty()) prepareKeyboard();
+  if (keysAreWanted() && !sNow.empty()) prepareKeyboard();
   return there != Shell::None;
+}
+
+std::string obstacle() {
+  if (!isOnWayland()) return "WAYLAND_DISPLAY is not set";
+  if (!open()) return "nobody has the name org.gnome.Shell on the session bus";
+  if (shell() == Shell::Telling) return "";
+  return "its extension kvd@tarn.com does not run: accessibility tells which program is in front, if it "
+         "knows";
 }
 
 bool takeIn() {
@@ -85,6 +94,8 @@ void close() {
 }  // namespace
 
 const Backend kBackend{
+    .name = "GNOME Shell",
+    .obstacle = obstacle,
     .open = open,
     .close = close,
     .takeIn = takeIn,

@@ -13,6 +13,7 @@
 #include "platform/linux/system/bus.h"
 #include "platform/linux/system/bus_values.h"
 #include "platform/linux/system/turn.h"
+#include "platform/linux/windows/backend.h"
 #include "platform/linux/windows/gnome/switch_on.h"
 
 namespace linux::windows::gnome {
@@ -193,7 +194,8 @@ Shell takeInShell() {
   }
   system::takeInBus();
   awaitAnswer();
-  if (sShell == Shell::Silent) switchOn();
+  // Who only looks changes nothing.
+  if (sShell == Shell::Silent && keysAreWanted()) switchOn();
   return sShell;
 }
 
