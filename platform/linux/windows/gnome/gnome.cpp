@@ -34,7 +34,7 @@ bool open() {
   }
   sNow = windowsNow();
   for (Window& window : sNow) window.id.backend = &kBackend;
-  if (keysAreWanted() && !sNow.empty()) prepareKeyboard();
+  if (keysAreWanted() && there == Shell::Silent && !sNow.empty()) prepareKeyboard();
   return there != Shell::None;
 }
 

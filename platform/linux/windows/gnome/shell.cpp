@@ -14,6 +14,7 @@
 #include "platform/linux/system/bus_values.h"
 #include "platform/linux/system/turn.h"
 #include "platform/linux/windows/backend.h"
+#include "platform/linux/windows/gnome/keyboard.h"
 #include "platform/linux/windows/gnome/switch_on.h"
 
 namespace linux::windows::gnome {
@@ -133,6 +134,7 @@ int takeList(sd_bus_message* answer, void*, sd_bus_error*) {
   std::vector<Window> windows = readWindows(answer);
   sd_bus_message_exit_container(answer);
   take(Shell::Telling, std::move(windows), readOutputs(answer));
+  if (keysAreWanted()) prepareKeyboard();
   return 0;
 }
 
