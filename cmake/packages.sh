@@ -38,6 +38,7 @@ is_installed() {
     libwayland-dev) pkg-config --exists wayland-client ;;
     libwayland-bin) pkg-config --exists wayland-scanner ;;
     libxkbcommon-dev) pkg-config --exists xkbcommon ;;
+    plasma-wayland-protocols) [[ -d /usr/share/$package || -d /usr/local/share/$package ]] ;;
     nlohmann-json3-dev) pkg-config --exists nlohmann_json ;;
     umockdev) command -v umockdev-wrapper >/dev/null ;;
     gir1.2-umockdev-1.0) /usr/bin/python3 -c 'import gi; gi.require_version("UMockdev", "1.0")' 2>/dev/null ;;

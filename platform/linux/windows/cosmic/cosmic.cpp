@@ -1,5 +1,7 @@
 #include "platform/linux/windows/cosmic/cosmic.h"
 
+#include <string>
+
 #include "platform/linux/windows/cosmic/toplevel_info.h"
 #include "platform/linux/windows/wayland/connection.h"
 #include "platform/linux/windows/wayland/keyboard.h"
@@ -23,12 +25,19 @@ void begin() {
   // Others tell more.
   if (!wayland::nobodySpeaks()) return;
   beginInfo();
-  if (hasInfo()) wayland::plugInKeyboard();
+  if (keysAreWanted() && hasInfo()) wayland::plugInKeyboard();
 }
 
 const wayland::Part kPart{.interests = kInterests, .isTold = hasInfo, .begin = begin, .end = endInfo};
 
 bool isConnected() { return wayland::connection() != nullptr && wayland::speaks(kPart); }
+
+std::string obstacle() {
+  if (isConnected())
+    return wayland::reachesFront() ? "" : "it makes no keyboards (zwp_virtual_keyboard_manager_v1)";
+  if (wayland::connection() == nullptr) return wayland::obstacle();
+  return hasInfo() ? "it is asked in another way" : "it does not offer zcosmic_toplevel_info_v1";
+}
 
 bool takeIn() {
   const bool isTold = isConnected();
@@ -50,6 +59,8 @@ void look(std::span<Window> windows) {
 }  // namespace
 
 const Backend kBackend{
+    .name = "COSMIC",
+    .obstacle = obstacle,
     .init = [] { wayland::join(kPart); },
     .open = isConnected,
     .close = wayland::disconnect,
@@ -57,7 +68,7 @@ const Backend kBackend{
     .list = []() -> const std::vector<Window>& { return sWindows; },
     .look = look,
     .knowsFront = isConnected,
-    .reach = [] { return isConnected() && wayland::hasKeyboard() ? Reach::FocusedWindow : Reach::Nobody; },
+    .reach = [] { return isConnected() && wayland::reachesFront() ? Reach::FocusedWindow : Reach::Nobody; },
     .activate = [](std::uint64_t) {},
     .sendKey = wayland::sendKey,
     .outputs = [] { return isConnected() ? wayland::outputs() : std::vector<Output>(); },

@@ -1,6 +1,7 @@
 #include "platform/linux/windows/kwin/kwin.h"
 
 #include <algorithm>
+#include <string>
 
 #include "platform/linux/windows/kwin/desktops.h"
 #include "platform/linux/windows/kwin/fake_keyboard.h"
@@ -31,7 +32,10 @@ constexpr wayland::Interest kInterests[] = {
 const wayland::Part kPart{
     .interests = kInterests,
     .isTold = hasManager,
-    .begin = prepareKeyboard,
+    .begin =
+        [] {
+          if (keysAreWanted()) prepareKeyboard();
+        },
     .end =
         [] {
           dropManager();
@@ -51,6 +55,16 @@ const Source* source() {
 }
 
 bool isOpen() { return source() != nullptr; }
+
+std::string obstacle() {
+  const Source* const by = source();
+  if (wayland::connection() == nullptr) return wayland::obstacle();
+  if (!sIsKWin) return "it is not KWin";
+  if (by == nullptr) return "no desktop entry lets this program ask, and it runs no scripts";
+  if (by == &kReports)
+    return "no desktop entry lets this program ask: a script tells of windows, and keys reach none";
+  return hasKeyboard() ? "" : "it takes no keys (org_kde_kwin_fake_input)";
+}
 
 std::vector<Window> told(const Source& by) {
   std::vector<Window> windows = by.windows();
@@ -103,6 +117,8 @@ bool sendKey(std::uint64_t window, std::uint32_t keysym, bool down, Modifiers mo
 }  // namespace
 
 const Backend kBackend{
+    .name = "KWin",
+    .obstacle = obstacle,
     .init = [] { wayland::join(kPart); },
     .open = isOpen,
     .close = wayland::disconnect,

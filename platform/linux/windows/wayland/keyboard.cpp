@@ -22,6 +22,8 @@ std::map<std::uint32_t, Place> sPlaces;
 /// The keys that are down.
 std::set<std::uint32_t> sDown;
 
+bool canBeMade() { return sManager != nullptr && seat() != nullptr; }
+
 std::uint32_t milliseconds() {
   timespec time{};
   clock_gettime(CLOCK_MONOTONIC, &time);
@@ -42,10 +44,8 @@ void dropKeyboards() {
   sManager = nullptr;
 }
 
-bool keyboardsAreMade() { return sManager != nullptr && seat() != nullptr; }
-
 void plugInKeyboard() {
-  if (!keyboardsAreMade()) return;
+  if (!canBeMade()) return;
   Keymap keymap = makeKeymap();
   // xkb's text ends with a NUL on the wire.
   const std::size_t size = keymap.text.size() + 1;
@@ -63,7 +63,7 @@ void pullOutKeyboard() {
   sDown.clear();
 }
 
-bool hasKeyboard() { return sKeyboard != nullptr; }
+bool reachesFront() { return keysAreWanted() ? sKeyboard != nullptr : canBeMade(); }
 
 bool tapKey(std::uint32_t keysym, bool down, Modifiers modifiers) {
   const auto place = sPlaces.find(keysym);

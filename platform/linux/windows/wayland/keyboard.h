@@ -16,9 +16,8 @@ void dropKeyboards();
 void plugInKeyboard();
 /// Pulls it out, which releases its keys.
 void pullOutKeyboard();
-bool hasKeyboard();
-/// Whether one could be plugged in.
-bool keyboardsAreMade();
+/// Whether keys reach the window in front. The same for who only looks, and has no keyboard plugged in.
+bool reachesFront();
 
 /// Presses or releases a key; what comes of it is on its way with the connection's next flush. False when it
 /// has no such key, and for the release of one that is not down.

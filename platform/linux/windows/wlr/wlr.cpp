@@ -33,11 +33,9 @@ const wayland::Part kPart{.interests = kInterests, .isTold = hasManager, .begin 
 
 bool isConnected() { return wayland::connection() != nullptr && wayland::speaks(kPart); }
 
-/// Who only looks has none plugged in.
-bool typesIntoFront() { return keysAreWanted() ? wayland::hasKeyboard() : wayland::keyboardsAreMade(); }
-
 std::string obstacle() {
-  if (isConnected()) return typesIntoFront() ? "" : "it makes no keyboards (zwp_virtual_keyboard_manager_v1)";
+  if (isConnected())
+    return wayland::reachesFront() ? "" : "it makes no keyboards (zwp_virtual_keyboard_manager_v1)";
   if (wayland::connection() == nullptr) return wayland::obstacle();
   return hasManager() ? "it is asked in another way" : "it does not offer zwlr_foreign_toplevel_manager_v1";
 }
@@ -87,7 +85,7 @@ const Backend kBackend{
     .list = []() -> const std::vector<Window>& { return sWindows; },
     .look = look,
     .knowsFront = isConnected,
-    .reach = [] { return isConnected() && typesIntoFront() ? Reach::FocusedWindow : Reach::Nobody; },
+    .reach = [] { return isConnected() && wayland::reachesFront() ? Reach::FocusedWindow : Reach::Nobody; },
     .activate = bringToFront,
     .sendKey = wayland::sendKey,
     .outputs = [] { return isConnected() ? wayland::outputs() : std::vector<Output>(); },
