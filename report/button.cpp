@@ -128,8 +128,7 @@ Object remarksOn(const Outcome& outcome, const Instance* target) {
   if (outcome.reason == Reason::RunsFirst && std::ranges::any_of(kPlayers, otherRuns)) {
     remarks.push_back(
         "A running kvd remembers the player that was in front or played at an earlier button and would "
-        "choose "
-        "that one first; this program cannot know it.");
+        "choose that one first; this program cannot know it.");
   }
   if (target != nullptr) {
     const auto inRole = programs::rankedInstances(target->role);

@@ -32,6 +32,13 @@ bool offersActions(const Performer& performer) {
   return window != nullptr && !window->gtk.busName.empty();
 }
 
+/// Of "NAME PATH INTERFACE MEMBER", an argument behind it too.
+std::string memberIn(const std::string& how) {
+  std::size_t at = 0;
+  for (int word = 0; word < 3; ++word) at = how.find(' ', at + 1);
+  return at != std::string::npos ? how.substr(at) : "";
+}
+
 std::string wayOf(const Action& action, const Performer& performer) {
   const std::string how = action.how;
   switch (action.means) {
@@ -42,7 +49,7 @@ std::string wayOf(const Action& action, const Performer& performer) {
     case Means::Action:
       return "its action " + how + (offersActions(performer) ? "" : " (not offered)");
     case Means::Method:
-      return "its method " + how.substr(how.rfind(' ') + 1);
+      return "its method" + memberIn(how);
     case Means::Key:
       return keyWay(performer, how);
     case Means::Nothing:

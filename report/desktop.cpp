@@ -85,6 +85,8 @@ const char* wordsFor(Ground ground) {
       return "its windows on the bus (table of programs)";
     case Ground::Categories:
       return "the categories of its desktop entry";
+    case Ground::BusWindows:
+      return "its windows on the bus (table of programs)";
     default:
       return "";
   }

@@ -21,6 +21,7 @@ enum class Ground : std::uint8_t {
   WindowClass,   ///< the table, by the class of its window
   Connection,    ///< the table, by its windows on the bus
   Categories,    ///< those of its entry
+  BusWindows,    ///< the table, by the windows that it has on the bus
 };
 
 struct Casting {

@@ -108,6 +108,7 @@ void addConnections(std::vector<Instance>& found) {
       if (casting.ground == Ground::DesktopEntry) casting.ground = Ground::Connection;
       instance = found.insert(found.end(), instanceOf(std::move(casting)));
       instance->process = process;
+      instance->ground = Ground::BusWindows;
     }
     instance->connection = connection.callee.name;
   }
