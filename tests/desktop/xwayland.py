@@ -19,5 +19,7 @@ def programs_on_either_server(desktop):
     told = json.loads(desktop.read("./kvd-report", "--json"))
     if [len(each["windows"]) for each in told["programs"]] != [1, 1] or len(told["outputs"]) != 1:
         raise Failed(f"kvd sees something twice: {told}")
+    older.process.kill()
+    newer.end()
     desktop.env["GDK_BACKEND"] = "x11"
     Evince(desktop).follow(("play", {"colour": 1, "full_screen": ["slides.pdf"]}), *SLIDES)
