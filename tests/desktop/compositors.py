@@ -29,8 +29,9 @@ class Wayland(Desktop):
         raise NotImplementedError
 
     def bring_to_front(self, title):
-        self.focus(title)
-        wait(lambda: [name for _, name in self.windows("state:active")] == [title], f"{title} is in front")
+        # Again and again: a window that has just opened may come to the front after the first time.
+        wait(lambda: self.focus(title) or [name for _, name in self.windows("state:active")] == [title],
+             f"{title} is in front")
 
     def front(self):
         """Without the domain that GTK programs have in their names."""
