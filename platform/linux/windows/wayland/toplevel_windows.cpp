@@ -12,7 +12,8 @@ Window windowOf(const Toplevel& toplevel, const Backend& backend) {
   window.id = {&backend, toplevel.number};
   window.process = toplevel.process;
   // It stands for the class too: programs have the same text there, and change it as they change their class.
-  window.applicationID = window.className = told.applicationID;
+  window.applicationID = window.className =
+      toplevel.applicationID.empty() ? told.applicationID : toplevel.applicationID;
   window.isDialog = told.isDialog;
   window.isActive = told.isActive;
   window.title = told.title;

@@ -41,6 +41,8 @@ struct Toplevel {
   // What the compositor's own language tells (processes.h).
   pid_t process = 0;
   std::int64_t container = 0;
+  /// Where it differs from what the protocol tells.
+  std::string applicationID;
 };
 
 /// Begins with none.

@@ -14,12 +14,22 @@ namespace {
 
 using Question = std::vector<Container> (*)(pid_t compositor, const base::Deadline& deadline);
 
+/// What must be the same in both tellings. Either may have changed between the two, and sway's protocol goes
+/// on with the application id that a window had first.
+enum class By : std::uint8_t { Both, ApplicationID, Title };
+
+bool areSame(const Container& container, const wayland::Description& told, By by) {
+  return (by == By::Title || container.applicationID == told.applicationID) &&
+         (by == By::ApplicationID || container.title == told.title);
+}
+
 constexpr Question kLanguages[] = {
     askSway,
     askHyprland,
 };
 
-/// The windows as the compositor tells them in its own language; none where it has none that is known.
+}  // namespace
+
 std::vector<Container> readContainers(pid_t compositor) {
   if (compositor == 0 || system::timedOutThisTurn(compositor)) return {};
   const system::Limit limit = system::patience(system::kQueryLimit);
@@ -35,8 +45,6 @@ std::vector<Container> readContainers(pid_t compositor) {
   return {};
 }
 
-}  // namespace
-
 void findProcesses(pid_t compositor, const std::vector<wayland::Toplevel*>& windows) {
   std::vector<wayland::Toplevel*> unknown;
   std::ranges::copy_if(windows, std::back_inserter(unknown),
@@ -48,28 +56,20 @@ void findProcesses(pid_t compositor, const std::vector<wayland::Toplevel*>& wind
   };
   std::erase_if(containers, isTaken);
   // Both sides in the order in which the windows were opened, so that those which nothing else tells apart
-  // meet as they should. A title may have changed between the two tellings.
+  // meet as they should.
   std::ranges::sort(unknown, {}, &wayland::Toplevel::age);
-  for (const bool byTitle : {true, false}) {
+  for (const By by : {By::Both, By::ApplicationID, By::Title}) {
     for (wayland::Toplevel* const window : unknown) {
       if (window->container != 0) continue;
-      const auto same = std::ranges::find_if(containers, [&](const Container& container) {
-        return container.applicationID == window->description.applicationID &&
-               (!byTitle || container.title == window->description.title);
-      });
+      const auto same = std::ranges::find_if(
+          containers, [&](const Container& each) { return areSame(each, window->description, by); });
       if (same == containers.end()) continue;
       window->container = same->id;
       window->process = same->process;
+      window->applicationID = same->applicationID;
       containers.erase(same);
     }
   }
-}
-
-std::optional<Container> lookAt(pid_t compositor, const wayland::Toplevel& window) {
-  const auto containers = readContainers(compositor);
-  const auto found = std::ranges::find(containers, window.container, &Container::id);
-  if (found == containers.end()) return std::nullopt;
-  return *found;
 }
 
 }  // namespace linux::windows::wlr

@@ -4,7 +4,6 @@
 
 #include <sys/types.h>
 
-#include <optional>
 #include <vector>
 
 #include "platform/linux/windows/wayland/toplevels.h"
@@ -15,7 +14,7 @@ namespace linux::windows::wlr {
 /// Asks the compositor for the processes of those windows that have none yet.
 void findProcesses(pid_t compositor, const std::vector<wayland::Toplevel*>& windows);
 
-/// Asks for the window as it is now; nothing where the compositor does not tell.
-std::optional<Container> lookAt(pid_t compositor, const wayland::Toplevel& window);
+/// Asks for all windows as they are now; none where the compositor does not tell.
+std::vector<Container> readContainers(pid_t compositor);
 
 }  // namespace linux::windows::wlr

@@ -1,6 +1,6 @@
 #include "platform/linux/windows/wlr/wlr.h"
 
-#include <optional>
+#include <algorithm>
 #include <string>
 
 #include "platform/linux/windows/wayland/connection.h"
@@ -55,11 +55,15 @@ bool takeIn() {
 
 void look(std::span<Window> windows) {
   wayland::connection();
+  const std::vector<Container> containers = readContainers(wayland::compositor());
   for (Window& window : windows) {
-    if (!wayland::lookAgain(window) || !window.isFullScreen) continue;
+    wayland::Toplevel* const toplevel = wayland::findToplevel(window.id.number);
+    const auto container = std::ranges::find_if(containers, [&](const Container& each) {
+      return toplevel != nullptr && each.id == toplevel->container;
+    });
+    if (container != containers.end()) toplevel->applicationID = container->applicationID;
+    if (!wayland::lookAgain(window) || container == containers.end() || !window.isFullScreen) continue;
     // Sway tells of full screen on workspaces that are not shown too, and since 1.10 of no outputs.
-    const auto container = lookAt(wayland::compositor(), *wayland::findToplevel(window.id.number));
-    if (!container) continue;
     window.isShown = container->isVisible;
     if (const Area area = wayland::areaOf(container->output); area.width > 0) window.area = area;
   }
