@@ -48,6 +48,8 @@ function describe(window) {
     };
     const workspace = global.workspace_manager.get_active_workspace();
     const isFullScreen = window.is_fullscreen();
+    // What a program of Wayland calls itself the shell keeps as the class.
+    const isOfX11 = window.get_client_type() === Meta.WindowClientType.X11;
     // The frame of one that has just gone full screen is still the old one.
     const area = isFullScreen
         ? global.display.get_monitor_geometry(window.get_monitor())
@@ -56,7 +58,8 @@ function describe(window) {
     told.id = GLib.Variant.new_uint32(window.get_stable_sequence());
     told.process = GLib.Variant.new_int32(window.get_pid());
     told.area = rectangleOf(area);
-    text('application-id', window.get_sandboxed_app_id() || window.get_gtk_application_id());
+    text('application-id', window.get_sandboxed_app_id() || window.get_gtk_application_id() ||
+        (isOfX11 ? null : window.get_wm_class()));
     text('class', window.get_wm_class());
     text('instance', window.get_wm_class_instance());
     text('title', window.get_title());
