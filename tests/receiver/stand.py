@@ -27,6 +27,9 @@ class Stand:
         self.run = tempfile.mkdtemp(prefix="kvd-receiver-")
         self.address = {bus: f"unix:path={self.run}/{bus}" for bus in ("SYSTEM", "SESSION")}
         sanitizer = os.environ.get("ASAN_OPTIONS", "") + ":verify_asan_link_order=0"
+        # Nobody tells of windows.
+        os.environ.pop("WAYLAND_DISPLAY", None)
+        os.environ.pop("DISPLAY", None)
         self.env = {**os.environ, "UMOCKDEV_DIR": BED.get_root_dir(), "XDG_RUNTIME_DIR": self.run,
                     "ASAN_OPTIONS": sanitizer,
                     **{f"DBUS_{bus}_BUS_ADDRESS": address for bus, address in self.address.items()}}
