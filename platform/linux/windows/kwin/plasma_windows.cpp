@@ -28,6 +28,8 @@ struct PlasmaWindow {
   org_kde_plasma_window* proxy = nullptr;
   /// All of its initial state has been told.
   bool isComplete = false;
+  /// It has a place. KWin goes on to tell newcomers of some that have gone, without one.
+  bool isPlaced = false;
 
   std::string title;
   std::string applicationID;
@@ -94,6 +96,7 @@ org_kde_plasma_window_listener makeWindowListener() {
   made.geometry = [](void* data, auto*, std::int32_t x, std::int32_t y, std::uint32_t, std::uint32_t) {
     self(data).x = x;
     self(data).y = y;
+    change(self(data).isPlaced, true);
   };
   made.icon_changed = ignore;
   made.pid_changed = [](void* data, auto*, std::uint32_t process) {
@@ -162,7 +165,7 @@ std::vector<Window> openedWindows() {
   std::vector<Window> opened;
   for (const auto& window : sWindows) {
     const bool isListed = (window->state & ORG_KDE_PLASMA_WINDOW_MANAGEMENT_STATE_SKIPTASKBAR) == 0;
-    if (window->isComplete && isListed) opened.push_back(windowOf(*window));
+    if (window->isComplete && window->isPlaced && isListed) opened.push_back(windowOf(*window));
   }
   return opened;
 }
