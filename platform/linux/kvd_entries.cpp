@@ -1,8 +1,8 @@
 // The program kvd-entries: tells kvd what the desktop entries say.
 //
-// Without an argument it writes a record for each installed program that plays a role, takes the remote itself
-// or was cast for either, each as soon as it is known; with --default-music-player the identifier of the person's default for music
-// files.
+// Without an argument it writes a record for each installed program that plays a role, takes the remote
+// itself or was cast for either, each as soon as it is known; with --default-music-player the identifier of
+// the person's default for music files.
 
 #include <gio/gdesktopappinfo.h>
 
