@@ -5,6 +5,7 @@
 #include "platform/base/object.h"
 #include "platform/base/values.h"
 #include "platform/host.h"
+#include "platform/linux/host/key_events.h"
 #include "platform/linux/sound/sound.h"
 #include "platform/linux/sound/sound_keys.h"
 #include "report/deeds.h"
@@ -15,21 +16,6 @@ namespace programs = linux::programs;
 
 constexpr std::int32_t kParameterError = -50;
 constexpr std::int32_t kNoSuchProcess = -600;
-
-struct EventSource final : HostObject {
-  static constexpr base::Kind kKind = base::Kind::EventSource;
-  EventSource() : HostObject(kKind) {}
-  bool shiftIsDown = false;
-};
-
-struct KeyEvent final : HostObject {
-  static constexpr base::Kind kKind = base::Kind::KeyEvent;
-  KeyEvent(EventSource* from, std::uint16_t key, bool isDown)
-      : HostObject(kKind), source(base::retained(from)), virtualKey(key), down(isDown) {}
-  const base::Owned<EventSource> source;
-  const std::uint16_t virtualKey;
-  const bool down;
-};
 
 std::string pressed(const base::SoundKey& key) {
   const auto sound = linux::sound::soundState();
@@ -44,15 +30,8 @@ std::string pressed(const base::SoundKey& key) {
 
 }  // namespace
 
-HostEventSourceRef HostCreatePrivateEventSource() { return HostEventSourceRef(new EventSource()); }
-
-HostKeyEventRef HostCreateKeyboardEvent(HostEventSourceRef source, std::uint16_t virtualKey, bool down) {
-  auto* const from = base::as<EventSource>(source);
-  return from != nullptr ? HostKeyEventRef(new KeyEvent(from, virtualKey, down)) : nullptr;
-}
-
 void HostPostEventToProcess(const HostProcessSerialNumber& process, HostKeyEventRef event) {
-  const auto* const key = base::as<KeyEvent>(event);
+  const auto* const key = base::as<linux::host::KeyEvent>(event);
   const programs::Instance* const instance = programs::findInstance(process);
   if (key == nullptr || instance == nullptr) return;
   if (key->virtualKey == HostVirtualKey::Shift) {
