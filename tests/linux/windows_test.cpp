@@ -74,6 +74,9 @@ TEST(Windows, OfTwoBackendsAreMerged) {
   EXPECT_EQ(list()[1].process, 42);
   const ID jaws[] = {{&kServer, 7}};
   EXPECT_EQ(look(jaws).at(0).applicationID, "mpv") << "a window is known by either number";
+  sSystems[0].windows[1].isShown = false;
+  EXPECT_FALSE(look(jaws).at(0).isShown) << "it is shown where both say so";
+  sSystems[0].windows[1].isShown = true;
   EXPECT_TRUE(sendKey({&kCompositor, 2}, 'a', true, kNoModifier));
   EXPECT_EQ(sSystems[1].keyFor, 7U) << "the server reaches what the compositor does not";
   EXPECT_FALSE(sendKey({&kCompositor, 1}, 'a', true, kNoModifier));

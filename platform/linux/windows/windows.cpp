@@ -192,7 +192,11 @@ std::vector<Window> look(std::span<const ID> windows) {
     if (!index) continue;
     Window& now = looked.emplace_back(lookBy(sIDs[*index].front(), sWindows[*index]));
     for (std::size_t i = 1; i < sIDs[*index].size(); ++i) {
-      fillIn(now, lookBy(sIDs[*index][i], sWindows[*index]));
+      const Window told = lookBy(sIDs[*index][i], sWindows[*index]);
+      // An X server takes what is on a workspace of the compositor's that nobody sees for shown.
+      const bool isShown = now.isShown && told.isShown;
+      fillIn(now, told);
+      now.isShown = isShown;
     }
   }
   return looked;
