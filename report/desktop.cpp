@@ -81,8 +81,6 @@ const char* wordsFor(Ground ground) {
       return "its desktop entry (table of programs)";
     case Ground::WindowClass:
       return "its window's class (table of programs)";
-    case Ground::Connection:
-      return "its windows on the bus (table of programs)";
     case Ground::Categories:
       return "the categories of its desktop entry";
     case Ground::BusWindows:

@@ -82,6 +82,7 @@ TEST(Report, TellsWhatKvdSeesAndWouldDo) {
   fake::writeEntry("cinema", {"Categories=AudioVideo;Player;Video;"});
   fake::writeEntry("chat", {"X-Kvd-Application=none"});
   fake::writeEntry("org.strawberrymusicplayer.strawberry", {});
+  fake::writeEntry("org.gnome.eog", {"X-Kvd-Application=com.tarn.Snapvale"});
   const auto player = [](const char* name, std::vector<std::string> words) {
     words.push_back(std::string("owns=org.mpris.MediaPlayer2.") + name);
     fake::startProgram(name, name, words);
@@ -91,6 +92,7 @@ TEST(Report, TellsWhatKvdSeesAndWouldDo) {
   player("mpv", {"title=Dune", "length=2h"});
   player("cinema", {"DesktopEntry=cinema"});
   player("chat", {"DesktopEntry=chat"});
+  fake::startProgram("eog", "eog", {"windows=1"});
   fake::startProgram("darktable", "darktable", {});
   openWindow("Photos", "darktable", "darktable");
   openWindow("Letter", "darktable", "gedit");
@@ -123,6 +125,8 @@ Programs with a role
                         known by its bus name (table of programs)
   cinema ()  modern movie player, paused at 0:00
                         known by the categories of its desktop entry
+  Eye of GNOME ()  photo library
+                        known by X-Kvd-Application in its desktop entry
   darktable ()  professional photos
                         known by its window's class (table of programs)
                         window "Photos"
@@ -149,6 +153,8 @@ What the button play would do now
 
 Silenced first
   Strawberry ()  pause
+  Eye of GNOME ()  stop slideshow: by its action win.view-slideshow=false, else by key Escape
+                        (lost: it is not in front)
   darktable ()  key Escape: by key Escape F11
   cinema ()  stop document
 
@@ -189,6 +195,8 @@ What the button playpause would do now
 
 Silenced first
   Strawberry ()  pause
+  Eye of GNOME ()  stop slideshow: by its action win.view-slideshow=false, else by key Escape
+                        (lost: it is not in front)
   cinema ()  stop document
   mpv ()  stop movie
 
@@ -212,6 +220,8 @@ What the button pick would do now
   goes to               Strawberry (), music player: it plays
 
 Silenced first
+  Eye of GNOME ()  stop slideshow: by its action win.view-slideshow=false, else by key Escape
+                        (lost: it is not in front)
   cinema ()  stop document
   mpv ()  stop movie
 

@@ -19,7 +19,6 @@ enum class Ground : std::uint8_t {
   BusName,       ///< the table, by its bus name
   DesktopEntry,  ///< the table, by its desktop entry
   WindowClass,   ///< the table, by the class of its window
-  Connection,    ///< the table, by its windows on the bus
   Categories,    ///< those of its entry
   BusWindows,    ///< the table, by the windows that it has on the bus
 };

@@ -105,10 +105,9 @@ void addConnections(std::vector<Instance>& found) {
       window.applicationID = connection.program->entry;
       Casting casting = castWindow(window);
       if (casting.role == Role::None) continue;
-      if (casting.ground == Ground::DesktopEntry) casting.ground = Ground::Connection;
+      if (casting.ground == Ground::DesktopEntry) casting.ground = Ground::BusWindows;
       instance = found.insert(found.end(), instanceOf(std::move(casting)));
       instance->process = process;
-      instance->ground = Ground::BusWindows;
     }
     instance->connection = connection.callee.name;
   }
