@@ -1,12 +1,17 @@
 #include "platform/stage/commands.h"
 
+#include <sys/socket.h>
+
 #include <algorithm>
+#include <cctype>
 #include <span>
 #include <string>
 #include <type_traits>
 #include <vector>
 
 #include "messages/kvd_messages.h"
+#include "platform/base/service_directory.h"
+#include "platform/base/sockets.h"
 #include "platform/mach.h"
 #include "platform/stage/desktop.h"
 #include "platform/stage/director.h"
@@ -97,6 +102,24 @@ void raw(const Words& words) {
   const auto value = remote::parseNumber<std::int32_t>("a value", words.at(2));
   const auto extra = words.size() > 3 ? remote::parseNumber<std::uint16_t>("an extra value", words.at(3)) : 0;
   send(kvd_handlehidevent, page, usage, static_cast<std::uint16_t>(extra), value);
+}
+
+/// Bytes from anybody who can reach the socket, whatever they mean.
+void datagram(const Words& words) {
+  const std::string& digits = words.at(0);
+  std::string bytes;
+  for (std::size_t i = 0; i < digits.size(); i += 2) {
+    const std::string pair = digits.substr(i, 2);
+    const auto isDigit = [](char c) { return std::isxdigit(static_cast<unsigned char>(c)) != 0; };
+    if (pair.size() != 2 || !std::ranges::all_of(pair, isDigit)) {
+      throw UsageError("bytes are pairs of hexadecimal digits, not " + inQuotes(digits));
+    }
+    bytes += static_cast<char>(std::stoi(pair, nullptr, 16));
+  }
+  const auto directory = base::serviceDirectory(base::Side::Sends);
+  const auto address = directory ? base::serviceAddress(*directory, kKVDServiceName) : std::nullopt;
+  const base::FileDescriptor socket = address ? base::connectedSocket(*address) : base::FileDescriptor();
+  if (::send(socket.get(), bytes.data(), bytes.size(), MSG_NOSIGNAL) < 0) say("nobody is listening");
 }
 
 bool onOrOff(const std::string& word) {
@@ -268,6 +291,7 @@ constexpr Command kCommands[] = {
     {"release", "BUTTON", "the release alone", 1, 1, true, release},
     {"hold", "BUTTON TIME", "press, wait, release", 2, 2, true, hold},
     {"raw", "PAGE USAGE VALUE [EXTRA]", "a button message by its numbers", 3, 4, true, raw},
+    {"datagram", "BYTES", "any bytes for the service port, in hexadecimal", 1, 1, true, datagram},
     {"lock", "on|off", "lock or unlock the screen", 1, 1, true, lock},
     {"quit", "", "ask the daemon to end", 0, 0, true, quitDaemon},
     {"open", "APP [again]", "start an application; any identifier with dots is one", 1, 2, false, open},

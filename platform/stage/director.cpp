@@ -4,6 +4,7 @@
 
 #include "daemon/lifecycle.h"
 #include "platform/stage/commands.h"
+#include "platform/stage/desktop.h"
 #include "platform/stage/quantities.h"
 
 namespace stage {
@@ -46,6 +47,15 @@ std::optional<Nanoseconds> waitEnd() { return sWaitEnd; }
 void finishWait() {
   sWaitEnd.reset();
   if (const auto then = std::exchange(sThen, nullptr)) then();
+}
+
+void letTimePass(std::optional<Nanoseconds> deadline) {
+  const Nanoseconds end = *waitEnd();
+  const Nanoseconds next = *earlier(earlier(end, deadline), nextDesktopChange());
+  advanceTo(next);
+  advanceDesktop();
+  const bool timerIsDue = deadline && *deadline <= next;
+  if (next == end && !timerIsDue) finishWait();
 }
 
 void waitThen(Nanoseconds duration, std::function<void()> then) {

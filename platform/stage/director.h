@@ -24,6 +24,9 @@ int runDaemon();
 std::optional<Nanoseconds> waitEnd();
 /// Ends that wait and does what was to be done then.
 void finishWait();
+/// In virtual time, during such a wait: moves time to the next thing that happens, or to the wait's end.
+/// `deadline` is when the run loop's next timer is due, if there is one.
+void letTimePass(std::optional<Nanoseconds> deadline);
 /// Where it goes what was done at the desktop, in the words of commands; nowhere when empty.
 void setKeeper(std::function<void(const std::string& command)> keeper);
 

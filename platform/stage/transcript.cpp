@@ -53,19 +53,6 @@ void writeLines() {
   sOutput->flush();
 }
 
-/// Moves time to the next thing that happens, or to the end of the wait.
-void moveTime(std::optional<Nanoseconds> deadline) {
-  const Nanoseconds end = *waitEnd();
-  const std::optional<Nanoseconds> change = nextDesktopChange();
-  Nanoseconds next = end;
-  if (deadline) next = std::min(next, *deadline);
-  if (change) next = std::min(next, *change);
-  advanceTo(next);
-  advanceDesktop();
-  const bool timerIsDue = deadline && *deadline <= next;
-  if (next == end && !timerIsDue) finishWait();
-}
-
 void perform(const std::string& line) {
   sCommandStart = now();
   if (!performCommand(line)) sFailed = true;
@@ -93,7 +80,7 @@ constexpr int kNoLoop = -1;
 
 void performRest() {
   do {
-    while (waitEnd()) moveTime(std::nullopt);
+    while (waitEnd()) letTimePass(std::nullopt);
   } while (!sInputEnded && !sPending && !base::endedBySignal() && performNextCommand(kNoLoop));
 }
 
@@ -108,7 +95,7 @@ void wait(std::optional<Nanoseconds> deadline) {
   if (sPending) {
     perform(*std::exchange(sPending, std::nullopt));
   } else if (waitEnd()) {
-    moveTime(deadline);
+    letTimePass(deadline);
   } else if (sServing || sInputEnded) {
     base::waitForSources(std::nullopt);
   } else if (!performNextCommand(base::runLoopDescriptor()) && sReader->atEnd()) {

@@ -14,6 +14,7 @@ namespace {
 using namespace linux::windows;
 
 void look(std::span<Window> windows) {
+  if (screen().callFails()) return;
   for (Window& looked : windows) {
     const auto now = std::ranges::find(screen().windows, looked.id, &Window::id);
     if (now != screen().windows.end()) looked = *now;
@@ -22,7 +23,7 @@ void look(std::span<Window> windows) {
 
 bool tell(std::uint64_t number, const std::string& text) {
   const auto found = std::ranges::find(screen().windows, ID{&kWindows, number}, &Window::id);
-  if (found == screen().windows.end()) return false;
+  if (found == screen().windows.end() || screen().callFails()) return false;
   screen().journal("window " + found->title + ": " + text);
   return true;
 }
@@ -42,9 +43,12 @@ Backend makeBackend() {
   Backend backend = kNone;
   backend.open = [] { return true; };
   backend.takeIn = [] { return std::exchange(screen().changed, false); };
-  backend.list = []() -> const std::vector<Window>& { return screen().windows; };
+  backend.list = []() -> const std::vector<Window>& {
+    static const std::vector<Window> none;
+    return screen().callFails() ? none : screen().windows;
+  };
   backend.look = look;
-  backend.knowsFront = [] { return screen().knowsFront; };
+  backend.knowsFront = [] { return !screen().callFails() && screen().knowsFront; };
   backend.reach = [] { return screen().reach; };
   backend.activate = [](std::uint64_t number) { tell(number, "activate"); };
   backend.sendKey = takeKey;

@@ -19,6 +19,8 @@ struct Screen {
   std::vector<linux::windows::Window> windows;
   /// Set when windows come, go, or another one is active.
   bool changed = false;
+  /// Whether the present call of the window system fails: it shows nothing or does nothing.
+  std::function<bool()> callFails = [] { return false; };
   /// Told of what reaches a window: "window Talk: key F5 down".
   std::function<void(const std::string& text)> journal;
 };
