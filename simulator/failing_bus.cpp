@@ -19,6 +19,7 @@
 #include <string>
 #include <string_view>
 
+#include "platform/stage/clock.h"
 #include "tests/linux/fake_windows.h"
 
 // The names that the linker gives to the functions themselves and to what stands before them.
@@ -55,8 +56,12 @@ struct Plan {
   ~Plan() { std::fprintf(stderr, "%llu calls\n", static_cast<unsigned long long>(calls)); }
 };
 
+/// Stories are over by then; what comes behind them meets no failure.
+constexpr stage::Nanoseconds kAllIsWell = stage::kVirtualStart + 3600 * stage::kSecond;
+
 Fate nextCall() {
   static Plan plan;
+  if (stage::now() >= kAllIsWell) return Fate::Reached;
   return ++plan.calls == plan.number ? plan.fate : Fate::Reached;
 }
 
