@@ -31,8 +31,9 @@ std::list<Player> sPlayers;
 std::map<std::string, std::string> sOwners;
 bool sChanged = false;
 std::uint64_t sPlaybackChanges = 0;
-/// The connection that all this is known from.
+/// The connection that all this is known from, and whether it has told of all players that were there first.
 unsigned sGeneration = 0;
+bool sFirstAreKnown = false;
 
 /// The identifier of a desktop entry, as a player tells it; never a path.
 std::string entryFrom(std::string text) {
@@ -135,6 +136,7 @@ void beginAnew() {
   sPlayers.clear();
   sOwners.clear();
   sGeneration = system::busGeneration();
+  sFirstAreKnown = false;
   if (bus() == nullptr) return;
   const std::string changes = std::string("type='signal',path='") + mpris::kPath + "',interface='" +
                               mpris::kPropertiesInterface + "',member='PropertiesChanged',arg0='" +
@@ -185,6 +187,7 @@ void awaitIntroductions() {
 
 bool takeInPlayers() {
   if (bus() == nullptr || sGeneration != system::busGeneration()) beginAnew();
+  if (!sFirstAreKnown) sFirstAreKnown = system::tellNames(kFollower);
   system::takeInBus();
   awaitIntroductions();
   return std::exchange(sChanged, false);

@@ -28,8 +28,9 @@ struct Newcomer {
 std::map<std::string, Newcomer> sNewcomers;
 std::vector<Connection> sConnections;
 bool sChanged = false;
-/// The connection that all this is known from.
+/// The connection that all this is known from, and whether it has told of all names that were there first.
 unsigned sGeneration = 0;
+bool sFirstAreKnown = false;
 
 const Program* programNamed(std::string_view name) {
   const Program* const program = programByEntry(name);
@@ -59,6 +60,7 @@ void beginAnew() {
   sNewcomers.clear();
   sConnections.clear();
   sGeneration = system::busGeneration();
+  sFirstAreKnown = false;
   if (system::bus() != nullptr) system::followNames(kFollower);
 }
 
@@ -102,6 +104,7 @@ bool staysNew(const std::string& uniqueName, Newcomer& newcomer) {
 
 bool takeInConnections() {
   if (system::bus() == nullptr || sGeneration != system::busGeneration()) beginAnew();
+  if (!sFirstAreKnown) sFirstAreKnown = system::tellNames(kFollower);
   system::takeInBus();
   awaitProcesses();
   for (auto each = sNewcomers.begin(); each != sNewcomers.end();) {

@@ -66,17 +66,16 @@ std::uint64_t numberOf(const std::string& uniqueName) {
   return number;
 }
 
-/// Those that are there, with their owners.
-std::vector<std::pair<std::string, std::string>> wantedNames(const NameFollower& follower) {
+/// Those that are there, with their owners; an empty one is not known.
+std::optional<std::vector<std::pair<std::string, std::string>>> wantedNames(const NameFollower& follower) {
   std::vector<std::pair<std::string, std::string>> found;
   const Message answer = call(kBusItself, {kBusPath, kBusInterface, "ListNames"}, kQueryLimit, "");
   if (answer == nullptr || sd_bus_message_enter_container(answer.get(), SD_BUS_TYPE_ARRAY, "s") <= 0) {
-    return found;
+    return std::nullopt;
   }
   while (const auto name = readText(answer.get(), "s")) {
     if (found.size() == kMostNames) break;
-    if (!follower.wants(*name)) continue;
-    if (std::string owner = ownerOf(*name); !owner.empty()) found.emplace_back(*name, std::move(owner));
+    if (follower.wants(*name)) found.emplace_back(*name, ownerOf(*name));
   }
   std::ranges::sort(found, {}, [](const auto& each) { return std::pair(numberOf(each.second), each.first); });
   return found;
@@ -89,7 +88,20 @@ void followNames(const NameFollower& follower) {
                          "type='signal',sender='org.freedesktop.DBus',interface='org.freedesktop.DBus',"
                          "member='NameOwnerChanged'",
                          takeChange, nullptr, const_cast<NameFollower*>(&follower));
-  for (const auto& [name, owner] : wantedNames(follower)) follower.take(name, "", owner);
+}
+
+bool tellNames(const NameFollower& follower) {
+  const auto names = wantedNames(follower);
+  if (!names) return false;
+  bool toldAll = true;
+  for (const auto& [name, owner] : *names) {
+    if (owner.empty()) {
+      toldAll = false;
+    } else {
+      follower.take(name, "", owner);
+    }
+  }
+  return toldAll;
 }
 
 std::optional<pid_t> processOf(const std::string& uniqueName) {
