@@ -34,7 +34,7 @@ constexpr char kHelp[] =
 using Arguments = std::vector<std::string>;
 
 bool worlds(const Arguments& arguments) {
-  const int depth = remote::parseNumber<std::int8_t>("a depth", arguments.at(0));
+  const int depth = remote::parseNumber<std::uint8_t>("a depth", arguments.at(0));
   if (depth < 1) throw remote::UsageError("a depth is 1 or more");
   return simulator::searchWorlds(depth);
 }

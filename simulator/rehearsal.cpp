@@ -134,10 +134,14 @@ void leaveWord(const std::string& word) {
 
 std::string wordLeft() { return shared().word; }
 
-void waitForCopy(int process) {
-  alarm(0);
-  if (process < 0) fail("no process for a copy");
-  if (const auto what = misfortune(process)) fail(*what);
+bool inCopy() {
+  const pid_t copy = fork();
+  // A copy has no alarm of its own yet; this process needs none while it waits.
+  alarm(copy == 0 ? kPatience : 0);
+  if (copy == 0) return true;
+  if (copy < 0) fail("no process for a copy");
+  if (const auto what = misfortune(copy)) fail(*what);
+  return false;
 }
 
 std::uint64_t played() { return shared().commandCount; }

@@ -32,8 +32,9 @@ std::optional<Failure> rehearse(const Rehearsal& rehearsal);
 /// The same with a list of commands, where refused ones are ignored.
 std::optional<Failure> rehearse(const std::vector<std::string>& commands);
 
-/// For commands that fork: waits for the copy, and ends this process too where the copy has failed.
-void waitForCopy(int process);
+/// For commands that fork: true in a copy of this process; false here, once the copy has ended. Where a copy
+/// has failed this process ends too.
+bool inCopy();
 
 /// Leaves the process that called rehearse a word; the last one counts.
 void leaveWord(const std::string& word);
