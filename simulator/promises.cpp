@@ -136,7 +136,7 @@ bool hangsDelayHold() {
 
 enum class When { Always, NoCaptureSeen, NoSlidesShown };
 
-/// The buttons after which nobody else plays, by the application they go to.
+/// The buttons after which nobody else plays, by the application they go to; unused places are Key::Undefined.
 struct Silencing {
   AppCode target;
   When when;
@@ -156,6 +156,7 @@ constexpr Silencing kSilencing[] = {
 // clang-format on
 
 bool silences(const Button& button) {
+  if (button.key == Key::Undefined) return false;
   return std::ranges::any_of(kSilencing, [&](const Silencing& row) {
     if (row.target != sTarget || std::ranges::find(row.keys, button.key) == row.keys.end()) return false;
     return row.when == When::Always ||
@@ -262,8 +263,7 @@ void judgeLiveObjects(bool ended) {
   of(Kind::Timer) = (ended ? 0U : 1U) + (sRetriggerTimer ? 1U : 0U);
   of(Kind::String) = sKeptPieces;
   of(Kind::List) = sKeptLists;
-  of(Kind::SerialNumber) = sKeptNumbers;
-  of(Kind::SerialNumber) += cachedNumbers();
+  of(Kind::SerialNumber) = sKeptNumbers + cachedNumbers();
   const auto alive = base::aliveByKind();
   // Made at the first key and kept.
   of(Kind::EventSource) = std::min<std::size_t>(1, alive.at(static_cast<std::size_t>(Kind::EventSource)));
