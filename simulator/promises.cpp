@@ -136,7 +136,8 @@ bool hangsDelayHold() {
 
 enum class When { Always, NoCaptureSeen, NoSlidesShown };
 
-/// The buttons after which nobody else plays, by the application they go to; unused places are Key::Undefined.
+/// The buttons after which nobody else plays, by the application they go to; unused places are
+/// Key::Undefined.
 struct Silencing {
   AppCode target;
   When when;

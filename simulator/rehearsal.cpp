@@ -2,6 +2,7 @@
 
 #include <stdlib.h>
 #include <sys/mman.h>
+#include <sys/time.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -23,8 +24,8 @@ namespace simulator {
 
 namespace {
 
-/// A daemon that answers nobody for so many seconds hangs.
-constexpr unsigned kPatience = 60;
+/// A daemon that works for so many seconds of the processor's time hangs.
+constexpr time_t kPatience = 60;
 
 constexpr int kBroken = 3;
 
@@ -69,6 +70,12 @@ void note(const std::string& command) {
   _exit(0);
 }
 
+/// Has a signal end this process when the time is over; a copy begins without that.
+void limitTime() {
+  const itimerval limit{.it_interval = {}, .it_value = {.tv_sec = kPatience, .tv_usec = 0}};
+  setitimer(ITIMER_PROF, &limit, nullptr);
+}
+
 /// How a process ended, where that was not well.
 std::optional<std::string> misfortune(int process) {
   int status = 0;
@@ -77,13 +84,13 @@ std::optional<std::string> misfortune(int process) {
   }
   if (status == 0) return std::nullopt;
   if (WIFEXITED(status) && WEXITSTATUS(status) == kBroken) return shared().what;
-  if (WIFSIGNALED(status) && WTERMSIG(status) == SIGALRM) return "the daemon hangs";
+  if (WIFSIGNALED(status) && WTERMSIG(status) == SIGPROF) return "the daemon hangs";
   return WIFSIGNALED(status) ? std::string("the daemon dies: ") + strsignal(WTERMSIG(status))
                              : "the process ends with status " + std::to_string(WEXITSTATUS(status));
 }
 
 [[noreturn]] void play(const Rehearsal& rehearsal) {
-  alarm(kPatience);
+  limitTime();
   const auto wait = [&](std::optional<base::Nanoseconds> deadline) {
     if (stage::waitEnd()) return stage::letTimePass(deadline);
     checkAtRest();
@@ -136,9 +143,10 @@ std::string wordLeft() { return shared().word; }
 
 bool inCopy() {
   const pid_t copy = fork();
-  // A copy has no alarm of its own yet; this process needs none while it waits.
-  alarm(copy == 0 ? kPatience : 0);
-  if (copy == 0) return true;
+  if (copy == 0) {
+    limitTime();
+    return true;
+  }
   if (copy < 0) fail("no process for a copy");
   if (const auto what = misfortune(copy)) fail(*what);
   return false;

@@ -15,25 +15,31 @@ namespace {
 struct World {
   const char* name;
   const char* applications[3];
+  /// Longer than kvd stays without a button; less where a held button repeats a hundred times a second.
+  const char* night;
   std::vector<std::string> beginning;
 };
 
 const World kWorlds[] = {
-    {"an empty desktop", {"lyrabox", "spindle", "slidewell"}, {}},
+    {"an empty desktop", {"lyrabox", "spindle", "slidewell"}, "2h20m", {}},
     {"a film, a disc and music",
      {"lyrabox", "spindle", "vistremeplayerx"},
+     "2h20m",
      {"open lyrabox", "open spindle", "open vistremeplayerx", "tell lyrabox to play",
       "tell spindle to play dvd"}},
     {"a disc's menu beside a film",
      {"spindle", "com.tarn.vistremeplayer", "lyrabox"},
+     "1m",
      {"open spindle", "tell spindle to go to main menu", "open com.tarn.vistremeplayer",
       "front com.tarn.vistremeplayer", "volume 100"}},
     {"shows",
      {"slidewell", "snapvale", "lumbra"},
+     "2h20m",
      {"open slidewell", "open snapvale", "open lumbra", "front slidewell",
       "tell slidewell to start slideshow"}},
     {"photos with music",
      {"lumbra", "snapvale", "lyrabox"},
+     "2h20m",
      {"version snapvale 7.1", "open lumbra", "open snapvale", "open lyrabox", "tell lyrabox to play",
       "front lumbra"}},
 };
@@ -42,13 +48,14 @@ const World kWorlds[] = {
 const std::string kStimuli[] = {
     "press select", "press playpause", "press pick",      "press stop", "press menu", "press up",
     "release up",   "press forward",   "release forward", "lock on",    "lock off",   "quit",
-    "front nobody", "wait 2s",         "wait 10s",        "wait 2h20m",
+    "front nobody", "wait 2s",         "wait 10s",
 };
 /// And what can happen to each application.
 const std::string kFates[] = {"open %", "close %", "front %", "answers % errors", "hang % 3s"};
 
 std::vector<std::string> stimuliOf(const World& world) {
   std::vector<std::string> all(std::begin(kStimuli), std::end(kStimuli));
+  all.push_back(std::string("wait ") + world.night);
   for (const char* const application : world.applications) {
     for (std::string fate : kFates) all.push_back(fate.replace(fate.find('%'), 1, application));
   }
