@@ -27,7 +27,7 @@ void addPlaces(xkb_keymap* keymap, xkb_keycode_t code, void* data) {
     const xkb_keysym_t* symbols = nullptr;
     const xkb_level_index_t level = modifiers == kShift ? 1 : 0;
     if (code >= kEvdevOffset && xkb_keymap_key_get_syms_by_level(keymap, code, 0, level, &symbols) == 1) {
-      places.try_emplace(*symbols, code - kEvdevOffset, modifiers);
+      places.try_emplace(*symbols, Place{code - kEvdevOffset, modifiers});
     }
   }
 }
