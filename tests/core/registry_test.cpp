@@ -4,10 +4,13 @@
 
 #include <gtest/gtest.h>
 
+#include <fstream>
+
 #include "platform/base/values.h"
 #include "platform/stage/report.h"
 #include "registry/bridge.h"
 #include "tests/core/rehearsal.h"
+#include "tests/temporary_directory.h"
 
 namespace {
 
@@ -70,7 +73,7 @@ TEST(Registry, TellsTheFrontmostApplication) {
       {Bundle::Slidewell, "Slid"}, {Bundle::Daemon, "none"},          {"com.tarn.lumbra", "none"},
   };
   for (const auto& [identifier, code] : rows) {
-    EXPECT_EQ(inChild([&] {
+    EXPECT_EQ(inChild([identifier = identifier] {
                 const std::string nobody = codeText(FrontProcessID());
                 set(std::string("open ") + identifier + "; front " + identifier);
                 return nobody + " " + codeText(FrontProcessID()) + " " + stage::aliveText();
@@ -86,7 +89,7 @@ TEST(Registry, ReadsTheMajorVersion) {
       {"12beta.1", 12}, {"-3.1", -3}, {"99999999999.0", 2147483647},
   };
   for (const auto& [version, major] : rows) {
-    EXPECT_EQ(inChild([&] {
+    EXPECT_EQ(inChild([version = version] {
                 const std::int32_t absent = getSnapvaleVersion();
                 set(std::string("open snapvale; version snapvale ") + version);
                 return std::to_string(absent) + " " + std::to_string(getSnapvaleVersion());
@@ -100,6 +103,26 @@ TEST(Registry, ReadsTheMajorVersion) {
               return stage::aliveText();
             }),
             "string ×3, list ×1, serial number ×1");
+}
+
+TEST(Registry, ReadsThePropertyListsOfABundle) {
+  EXPECT_EQ(inChild([] {
+              const TemporaryDirectory directory;
+              std::ofstream(directory.path / "keys.plist") << "<plist><dict/></plist>";
+              std::ofstream(directory.path / "huge.plist");
+              std::filesystem::resize_file(directory.path / "huge.plist", 1 << 30);
+              const HostBundleRef bundle = HostCreateBundle(directory.path.c_str());
+              std::string read;
+              for (const char* name : {"keys", "huge", "absent"}) {
+                const HostDictionaryRef dictionary =
+                    CreateDictionaryFromPList(bundle, HostGetConstantString(name));
+                if (dictionary) read += name + std::string(", ");
+                HostRelease(dictionary);
+              }
+              HostRelease(bundle);
+              return read + stage::aliveText();
+            }),
+            "keys, nothing");
 }
 
 TEST(Bridge, TurnsResultsIntoNumbersAndCodes) {
