@@ -124,6 +124,7 @@ TEST(Repeat, OfAVolumeButtonEndsAfterTenSecondsOrAtTheNextEvent) {
   EXPECT_EQ(inChild([] {
               retrigger({0x0C, 0xE9, 0}, 0, 0.1, 10);
               retriggerCallback(nullptr, nullptr);
+              stopRetrigger();
               return journal();
             }),
             "") << "a release is not repeated, and nothing where nothing is held";

@@ -129,6 +129,7 @@ inline constexpr auto kProperties =
                                  {kAlbum, "id", code("ID  "), Type::Integer}});
 inline constexpr auto kCommands = std::to_array<CommandTerm>({{"play", code("play"), true},
                                                               {"pause", code("paus"), true},
+                                                              {"count", code("cnte"), true},
                                                               {"fast forward", code("ffwd"), false},
                                                               {"step forward", code("stpf"), true},
                                                               {"step backward", code("stpb"), true},
