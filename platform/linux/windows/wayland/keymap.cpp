@@ -34,9 +34,7 @@ void addPlaces(xkb_keymap* keymap, xkb_keycode_t code, void* data) {
 
 using Context = std::unique_ptr<xkb_context, decltype(&xkb_context_unref)>;
 
-Context makeContext() {
-  return Context(xkb_context_new(XKB_CONTEXT_NO_ENVIRONMENT_NAMES), xkb_context_unref);
-}
+Context makeContext() { return {xkb_context_new(XKB_CONTEXT_NO_ENVIRONMENT_NAMES), xkb_context_unref}; }
 
 }  // namespace
 
