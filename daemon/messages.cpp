@@ -90,6 +90,6 @@ void _Xsetscreenlocked(mach_msg_header_t* request, mach_msg_header_t* reply) {
 }
 
 void MachMessageReceivedCallback(HostPortRef, void* message, std::size_t, void*) {
-  mig_reply_error_t reply;
+  mig_reply_error_t reply = {};
   KVD_server(static_cast<mach_msg_header_t*>(message), &reply.Head);
 }

@@ -27,7 +27,7 @@ struct HostHandle {
   HostObject* object = nullptr;
 
   constexpr HostHandle() = default;
-  constexpr HostHandle(std::nullptr_t) {}
+  constexpr HostHandle(std::nullptr_t) {}  // NOLINT(google-explicit-constructor): null is of every kind
   constexpr explicit HostHandle(HostObject* counted) : object(counted) {}
   constexpr explicit operator bool() const { return object != nullptr; }
   friend constexpr bool operator==(HostHandle, HostHandle) = default;

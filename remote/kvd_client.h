@@ -4,14 +4,14 @@
 // is full is waited for, five seconds at most. Not for several threads at once.
 #pragma once
 
-#include <stdint.h>
+#include <stdint.h>  // NOLINT(modernize-deprecated-headers): C includes this
 
 #ifdef __cplusplus
 extern "C" {
 #endif
 
-typedef uint32_t mach_port_t;
-typedef int32_t mach_msg_return_t;
+typedef uint32_t mach_port_t;       // NOLINT(modernize-use-using): C includes this
+typedef int32_t mach_msg_return_t;  // NOLINT(modernize-use-using): C includes this
 
 /// What the calls return; other numbers are other errors.
 enum {

@@ -47,7 +47,7 @@ Integer parseNumber(std::string_view what, std::string_view text) {
   }
   constexpr std::int64_t kLeast = std::numeric_limits<Integer>::min();
   constexpr std::int64_t kMost = std::numeric_limits<Integer>::max();
-  const std::uint64_t largest = static_cast<std::uint64_t>(negative ? -kLeast : kMost);
+  const auto largest = static_cast<std::uint64_t>(negative ? -kLeast : kMost);
   if (error != std::errc() || magnitude > largest) {
     throw UsageError(std::string(what) + " is " + std::to_string(kLeast) + " to " + std::to_string(kMost) +
                      ", not " + std::string(text));

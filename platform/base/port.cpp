@@ -45,7 +45,7 @@ std::function<void(std::span<const std::byte>, pid_t)> observe;
 /// size. Rights that a message pretends to carry stay visible as the complex bit.
 void stampHeader(std::vector<std::byte>& message, mach_port_t arrival) {
   constexpr int localDispositionShift = 8;
-  mach_msg_header_t header;
+  mach_msg_header_t header = {};
   std::memcpy(&header, message.data(), sizeof header);
   header.msgh_bits = (header.msgh_bits & MACH_MSGH_BITS_COMPLEX) | MACH_MSG_TYPE_PORT_SEND
                                                                        << localDispositionShift;

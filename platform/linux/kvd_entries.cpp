@@ -33,7 +33,7 @@ constexpr std::string_view kSuffix = ".desktop";
 
 /// In bytes: the largest real ones hold a name in every language and have a third of that. What is larger is
 /// no entry.
-constexpr std::uintmax_t kLargestFile = 256 * 1024;
+constexpr std::uintmax_t kLargestFile = std::uintmax_t{256} * 1024;
 
 struct StringReleaser {
   void operator()(char* text) const { g_free(text); }

@@ -11,7 +11,7 @@ namespace property_list {
 namespace {
 
 /// A resource is read whole; larger files are no property lists of an application.
-constexpr std::uintmax_t kLargestResource = 16u << 20;
+constexpr std::uintmax_t kLargestResource = 16U << 20;
 
 struct Bundle final : HostObject {
   static constexpr base::Kind kKind = base::Kind::Bundle;

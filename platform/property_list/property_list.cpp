@@ -18,7 +18,7 @@ using base::Owned;
 using base::String;
 
 /// An application's property list has some kilobytes; reading stays short whatever is handed in.
-constexpr std::size_t kLargestPropertyList = 4u << 20;
+constexpr std::size_t kLargestPropertyList = 4U << 20;
 /// Containers within containers; reading and releasing them recurse once a level.
 constexpr int kDeepestNesting = 64;
 

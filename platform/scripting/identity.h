@@ -39,7 +39,7 @@ auto findNamed(const Applications& applications, std::string_view text, Identity
       return same(identity.identifier, text) || same(identity.name, text);
     });
   };
-  const auto exact = find(std::equal_to<std::string_view>());
+  const auto exact = find(std::equal_to<>());
   return exact != std::end(applications) ? exact : find(text::equalIgnoringCase);
 }
 

@@ -2,10 +2,10 @@
 
 #include <poll.h>
 #include <sys/signalfd.h>
-#include <time.h>
 
 #include <algorithm>
 #include <csignal>
+#include <ctime>
 #include <utility>
 
 #include "platform/base/clock.h"

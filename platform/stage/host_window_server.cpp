@@ -111,6 +111,8 @@ std::int32_t HostGetActiveDisplayList(std::uint32_t capacity, HostDisplayID* dis
 
 std::uint32_t HostDisplayIsCaptured(HostDisplayID id) {
   const auto& displays = stage::desktop().displays;
-  return std::any_of(displays.begin(), displays.end(),
-                     [&](const stage::Display& display) { return display.id == id && display.captured(); });
+  const bool isCaptured = std::any_of(displays.begin(), displays.end(), [&](const stage::Display& display) {
+    return display.id == id && display.captured();
+  });
+  return isCaptured ? 1 : 0;
 }

@@ -71,7 +71,7 @@ Code toTypeCode(const Value& value);
 // --------------------------------------------------------------------------------------------
 
 /// What kind of value a property or parameter holds.
-enum class Type { Any, Boolean, Integer, Real, Text, Constant, Object };
+enum class Type { Boolean, Integer, Real, Text, Constant, Object };
 
 /// A class of objects, in the singular and the plural.
 struct ClassTerm {

@@ -114,8 +114,6 @@ Value coerce(Value value, Type type) {
     throw Failure{"cannot make " + std::string(kindName(value)) + " into " + wanted};
   };
   switch (type) {
-    case Type::Any:
-      return std::holds_alternative<std::monostate>(value) ? refuse("a value") : value;
     case Type::Boolean:
       return std::holds_alternative<bool>(value) ? value : refuse("a boolean");
     case Type::Constant:

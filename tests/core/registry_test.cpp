@@ -4,10 +4,32 @@
 
 #include <gtest/gtest.h>
 
+#include <fstream>
+
 #include "platform/base/values.h"
 #include "platform/stage/report.h"
 #include "registry/bridge.h"
 #include "tests/core/rehearsal.h"
+#include "tests/temporary_directory.h"
+
+namespace {
+/// Whether who is in front has ended by the time that it is asked about.
+bool sEndsMeanwhile = false;
+}  // namespace
+
+// The linker puts this between the core and the host (--wrap).
+extern "C" {
+HostDictionaryRef
+    __real__Z30HostCopyApplicationInformationi10HostHandleI20HostSerialNumberKindES_I14HostStringKindE(
+        HostSessionID, HostSerialNumberRef, HostStringRef);
+HostDictionaryRef
+__wrap__Z30HostCopyApplicationInformationi10HostHandleI20HostSerialNumberKindES_I14HostStringKindE(
+    HostSessionID session, HostSerialNumberRef application, HostStringRef key) {
+  if (sEndsMeanwhile) return nullptr;
+  return __real__Z30HostCopyApplicationInformationi10HostHandleI20HostSerialNumberKindES_I14HostStringKindE(
+      session, application, key);
+}
+}
 
 namespace {
 
@@ -70,12 +92,14 @@ TEST(Registry, TellsTheFrontmostApplication) {
       {Bundle::Slidewell, "Slid"}, {Bundle::Daemon, "none"},          {"com.tarn.lumbra", "none"},
   };
   for (const auto& [identifier, code] : rows) {
-    EXPECT_EQ(inChild([&] {
+    EXPECT_EQ(inChild([identifier = identifier] {
                 const std::string nobody = codeText(FrontProcessID());
                 set(std::string("open ") + identifier + "; front " + identifier);
-                return nobody + " " + codeText(FrontProcessID()) + " " + stage::aliveText();
+                const std::string front = codeText(FrontProcessID());
+                sEndsMeanwhile = true;
+                return nobody + " " + front + " " + codeText(FrontProcessID()) + " " + stage::aliveText();
               }),
-              "none " + std::string(code) + " nothing");
+              "none " + std::string(code) + " none nothing");
   }
 }
 
@@ -86,7 +110,7 @@ TEST(Registry, ReadsTheMajorVersion) {
       {"12beta.1", 12}, {"-3.1", -3}, {"99999999999.0", 2147483647},
   };
   for (const auto& [version, major] : rows) {
-    EXPECT_EQ(inChild([&] {
+    EXPECT_EQ(inChild([version = version] {
                 const std::int32_t absent = getSnapvaleVersion();
                 set(std::string("open snapvale; version snapvale ") + version);
                 return std::to_string(absent) + " " + std::to_string(getSnapvaleVersion());
@@ -100,6 +124,26 @@ TEST(Registry, ReadsTheMajorVersion) {
               return stage::aliveText();
             }),
             "string ×3, list ×1, serial number ×1");
+}
+
+TEST(Registry, ReadsThePropertyListsOfABundle) {
+  EXPECT_EQ(inChild([] {
+              const TemporaryDirectory directory;
+              std::ofstream(directory.path / "keys.plist") << "<plist><dict/></plist>";
+              std::ofstream(directory.path / "huge.plist");
+              std::filesystem::resize_file(directory.path / "huge.plist", 1 << 30);
+              const HostBundleRef bundle = HostCreateBundle(directory.path.c_str());
+              std::string read;
+              for (const char* name : {"keys", "huge", "absent"}) {
+                const HostDictionaryRef dictionary =
+                    CreateDictionaryFromPList(bundle, HostGetConstantString(name));
+                if (dictionary) read += name + std::string(", ");
+                HostRelease(dictionary);
+              }
+              HostRelease(bundle);
+              return read + stage::aliveText();
+            }),
+            "keys, nothing");
 }
 
 TEST(Bridge, TurnsResultsIntoNumbersAndCodes) {

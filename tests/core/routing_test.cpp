@@ -62,6 +62,8 @@ TEST(Target, IsFrontmostElsePlayingElseLastElseFirst) {
       {{"open com.tarn.vistremeplayer; front com.tarn.vistremeplayer", "Vist"},
        {"open com.tarn.Snapvale; front com.tarn.Snapvale; open lyrabox", "Snap"},
        {"front nobody", "Lyra"}},
+      // A disc player that shows its menu counts as playing.
+      {{"open lyrabox; open spindle; tell spindle to go to main menu", "Spin"}},
       // Paused is not playing.
       {{"open lyrabox; open com.tarn.Spindle; front com.tarn.Spindle; tell lyrabox to play; tell lyrabox to "
         "pause",

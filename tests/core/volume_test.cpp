@@ -81,7 +81,7 @@ TEST(Volume, PressesAndReleasesSoundKeysOrLeavesThemToTheTarget) {
       // Two applications take these buttons themselves where they are the target, one of them while none of
       // the first eight displays is captured.
       {spin + "volume 100", kMenuUp, 1, disc, disc}, {spin + lyra, kUp, 1, up, upAgain},
-      {lumb, kMenuUp, 1, rowUp, rowUp}, {lumb, kUp, 1, "-", "-"},
+      {lumb + lyra, kUp, 1, up, upAgain}, {lumb, kMenuUp, 1, rowUp, rowUp}, {lumb, kUp, 1, "-", "-"},
       {lumb + "capture 1 on; break display-query", kUp, 1, "-", "-"},
       {lumb + "displays 9; capture 9 on", kUp, 1, "-", "-"},
       {lumb + "displays 9; capture 8 on", kMenuUp, 1, up, upAgain},
@@ -121,6 +121,13 @@ TEST(Repeat, OfAVolumeButtonEndsAfterTenSecondsOrAtTheNextEvent) {
             "lock on | break event-records | press up | " + kVolume0 + " | timer of 0.1s starts | "
             "wait 1.2s | +1.05s to +1.15s  ×2: | repeats e9000c by 1, locked | " + kVolume0 +
             " | release menu | timer of 0.1s stops | asks who is in front: Lyrabox | wait 5s");
+  EXPECT_EQ(inChild([] {
+              retrigger({0x0C, 0xE9, 0}, 0, 0.1, 10);
+              retriggerCallback(nullptr, nullptr);
+              stopRetrigger();
+              return journal();
+            }),
+            "") << "a release is not repeated, and nothing where nothing is held";
 }
 
 TEST(Repeat, OfAMenuStepHasNoLimitAndFollowsTheMenu) {

@@ -113,6 +113,7 @@ inline constexpr auto kClasses = std::to_array<ClassTerm>({{"document", "documen
 inline constexpr auto kProperties =
     std::to_array<PropertyTerm>({{kApp, "player state", code("stat"), Type::Constant},
                                  {kApp, "sound volume", code("vol "), Type::Integer},
+                                 {kApp, "play count", code("pcnt"), Type::Integer},
                                  {kApp, "frozen", code("froz"), Type::Boolean},
                                  {kApp, "chapter", code("chap"), Type::Integer},
                                  {kApp, "available chapters", code("chas"), Type::Integer},
@@ -128,6 +129,7 @@ inline constexpr auto kProperties =
                                  {kAlbum, "id", code("ID  "), Type::Integer}});
 inline constexpr auto kCommands = std::to_array<CommandTerm>({{"play", code("play"), true},
                                                               {"pause", code("paus"), true},
+                                                              {"count", code("cnte"), true},
                                                               {"fast forward", code("ffwd"), false},
                                                               {"step forward", code("stpf"), true},
                                                               {"step backward", code("stpb"), true},
@@ -174,6 +176,7 @@ class FakeWorld : public World {
     using words::kAlbum, words::kApp, words::kDoc;
     at(kApp, 0, "stat") = Constant{code("kPSP")};
     at(kApp, 0, "vol ") = std::int64_t{50};
+    at(kApp, 0, "pcnt") = std::int64_t{9};
     at(kApp, 0, "froz") = false;
     at(kApp, 0, "chap") = std::int64_t{1};
     at(kApp, 0, "chas") = std::int64_t{2};
@@ -194,8 +197,9 @@ class FakeWorld : public World {
       at(kDoc, id, "rate") = 1.0;
       at(kDoc, id, "dply") = true;
     }
-    extras.replies[words::kVolumeSettings] = std::make_shared<const std::map<Code, Value>>(
-        std::map<Code, Value>{{code("ouvl"), std::int64_t{40}}, {code("mute"), true}});
+    extras.replies[words::kVolumeSettings] =
+        std::make_shared<const std::map<Code, Value>>(std::map<Code, Value>{
+            {code("ouvl"), std::int64_t{40}}, {code("mute"), true}, {code("vol "), std::int64_t{7}}});
   }
 
   Application* find(std::string_view name) override {

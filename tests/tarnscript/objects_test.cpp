@@ -39,13 +39,22 @@ TEST(Objects, AreAddressedInManyWays) {
       {"current album's name", "\"Album 3\""},
       {"tell front document to its name", "\"Clip 1\""},
       {"it", "capp#0"},
+      {"it is application \"Keyhouse\"", "false"},
       {"the current album is album 3", "true"},
       {"item 3 of {album 1, album 2, \"x\"} is the current album", "false"},
       {"set d to last document\nset rate of d to 3\nrate of d", "3.0 | rate of docu#2 = 3.0"},
       {"set rate of every document to 2", "2 | rate of docu#1 = 2.0; rate of docu#2 = 2.0"},
       {"rate of 5", "error 2: an integer has no property 'rate' here"},
       {"rate", "error 2: an object has no property 'rate' here"},
+      {"set rate to 5", "error 2: an object has no property 'rate' here"},
+      {"set rate of 5 to 1", "error 2: an integer has no property 'rate' here"},
+      {"tell application \"Keyhouse\" to output muted",
+       "error 2: an object has no property 'output muted' here"},
+      {"front document's if", "error 2: expected a property or an element, found 'if'"},
       {"document 1 of album 1", "error 2: there is no such document"},
+      {"document 1 of {1}", "error 2: a list has no elements of the class 'document'"},
+      {"item 1 of front document", "error 2: an object has no elements of the class 'item'"},
+      {"launch 5", "error 2: cannot start an integer"},
       {"tell {1} to play", "error 2: cannot tell a list anything"},
   });
 }
@@ -55,19 +64,28 @@ TEST(Objects, WordsAreTakenByPositionAndLength) {
       {"player state is playing", "true"},
       {"player state is not playing", "false"},
       {"player state = paused", "false"},
+      {"{player state is sound volume, front document is sound volume}", "{false, false}"},
+      {"playing", "'kPSP'"},
       {"set d to front document\nset rate of d to 0\nd is playing", "true | rate of docu#1 = 0.0"},
       {"tell front document to it is name", "false"},
       {"set player state to playing", "'kPSP' | stat of capp#0 = 'kPSP'"},
-      {"set player state to 5", "error 2: cannot make an integer into a constant"},
+      {"set player state to sound volume", "error 2: cannot make an integer into a constant"},
+      {"set player state to playing of front document", "error 2: cannot make a boolean into a constant"},
       {"set sound volume to sound volume - 2", "48 | vol  of capp#0 = 48"},
       {"set sound volume to -2.9", "-2.9 | vol  of capp#0 = -2"},
       {"set name of document 1 to 5", "5 | pnam of docu#1 = \"5\""},
+      {"set name of document 1 to true", "error 2: cannot make a boolean into a text"},
+      {"set rate of document 1 to \"a\"", "error 2: cannot make a text into a real"},
+      {"set frozen to 5", "error 2: cannot make an integer into a boolean"},
       {"set current album to 5", "error 2: cannot make an integer into an object"},
+      {"set current album to album 2", "albm#2 | cura of capp#0 = albm#2"},
       {"set sound volume to true", "error 2: cannot make a boolean into an integer"},
       {"if frozen then\nset frozen to false\nelse\nset frozen to true\nend if",
        "true | froz of capp#0 = true"},
       {"tell front document to set frozen to true", "true | froz of capp#0 = true"},
       {"chapter - 1", "0"},
+      {"chapter 2", "error 2: there is no such chapter"},
+      {"play count", "9"},
       {"slideshow running", "true"},
       {"get get rate of front document", "1.0"},
       {"show last slide of first slideshow", "none | show in capp#0: slid#71"},
@@ -91,13 +109,39 @@ TEST(Objects, WordsAreTakenByPositionAndLength) {
       {"output muted of (get get volume settings)", "true | gvol in capp#0"},
       {"set volume 30 without output muted", "none | svol in capp#0: 30 mute=false"},
       {"set volume output volume 30.0 with output muted", "none | svol in capp#0 mute=true ouvl=30"},
-      {"set volume with output volume",
+      {"set volume with output muted, output volume",
        "error 2: expected a parameter that is true or false, found 'output'"},
   });
   EXPECT_EQ(runScript("output volume of (get volume settings)"), "40 | gvol in capp#0");
   EXPECT_EQ(runScript("(get volume settings) is (get volume settings)"),
             "true | gvol in capp#0; gvol in capp#0");
+  EXPECT_EQ(runScript("get volume settings"), "record | gvol in capp#0");
+  EXPECT_EQ(runScript("(get volume settings output volume 5)"), "error 1: expected ')', found 'output'");
+  EXPECT_EQ(runScript(tell("sound volume of (get volume settings)")), "7 | gvol in capp#0");
   EXPECT_EQ(runScript("name of (get volume settings)"), "error 1: expected the end of the line, found 'of'");
+}
+
+TEST(Objects, RecordsAndListsMayDifferOrBeMissing) {
+  FakeWorld world;
+  const auto record = [](Code field) {
+    const Value forty = std::int64_t{40};
+    return std::make_shared<const std::map<Code, Value>>(
+        std::map<Code, Value>{{field, forty}, {code("ouvl"), forty}, {code("vol "), forty}});
+  };
+  world.player.replies = {{code("play"), record(code("mute"))},
+                          {code("paus"), record(code("zzzz"))},
+                          {code("ffwd"), Record()},
+                          {code("menu"), List()}};
+  EXPECT_EQ(runScript(world, tell("set a to get volume settings\nset b to (play)\nset c to (pause)\n"
+                                  "set d to (fast forward)\nset e to (go to main menu)\n"
+                                  "{a is b, b is c, a is d, d is a, d is d, count of e}")),
+            "{false, false, false, false, true, 0} | "
+            "gvol in capp#0; play in capp#0; paus in capp#0; ffwd in capp#0; menu in capp#0");
+  EXPECT_EQ(runScript(tell("name of (get volume settings)")),
+            "error 2: a record has no property 'name' here | gvol in capp#0");
+  world.log.clear();
+  EXPECT_EQ(runScript(world, tell("name of (fast forward)")),
+            "error 2: a record has no property 'name' here | ffwd in capp#0");
 }
 
 TEST(Objects, ApplicationsThatDoNotRun) {

@@ -48,6 +48,23 @@ tap app-menu
   script to Spindle: get dvd state = 'esid'
   script to Spindle: go to beginning of disc, fails in line 1: there is no disc
 
+# Menu Pick sends the jukebox an event instead of a script.
+open lyrabox
+  Lyrabox starts
+front lyrabox
+  Lyrabox comes to the front
+tap pick
+  finds Lyrabox running
+  finds Spindle running
+  asks who is in front: Lyrabox
+  asks whether Spindle runs: yes
+  script to Spindle: get dvd menu active = false
+  script to Spindle: get dvd state = 'esid'
+  event 'hook'/'RSel' to Lyrabox
+  Lyrabox: plays "Harbour Lights"
+close lyrabox
+  Lyrabox quits
+
 # Keys find no process, sound keys no window server, displays no answer.
 open lumbra
   Lumbra starts

@@ -48,6 +48,7 @@ bool appendList(sd_bus_message* message, const base::List& list) {
   for (HostObject* item : list.items) {
     if (!appendValue(message, item)) return false;
   }
+  // NOLINTNEXTLINE(misc-redundant-expression): it closes two containers
   return sd_bus_message_close_container(message) >= 0 && sd_bus_message_close_container(message) >= 0;
 }
 

@@ -69,8 +69,9 @@ std::vector<std::string> sessionEnvironment() {
 
 std::vector<char*> pointers(const std::vector<std::string>& texts) {
   std::vector<char*> result(texts.size() + 1, nullptr);
-  std::transform(texts.begin(), texts.end(), result.begin(),
-                 [](const std::string& text) { return const_cast<char*>(text.c_str()); });
+  std::transform(texts.begin(), texts.end(), result.begin(), [](const std::string& text) {
+    return const_cast<char*>(text.c_str());  // NOLINT(*-const-cast): execve changes none
+  });
   return result;
 }
 

@@ -40,7 +40,7 @@ enum class Way : std::uint8_t {
 /// A chapter, and how another one is gone to.
 struct Chapter {
   Place place;
-  Way way;
+  Way way = Way::None;
 };
 
 /// Where a film was left for the menu.

@@ -100,7 +100,7 @@ Message call(const Callee& callee, Message request, Limit limit) {
   if (request == nullptr || timedOutThisTurn(callee.process)) return nullptr;
   limit = patience(limit);
   sd_bus_message* answer = nullptr;
-  sd_bus_error error = SD_BUS_ERROR_NULL;
+  sd_bus_error error = {};
   const int result = sd_bus_call(sd_bus_message_get_bus(request.get()), request.get(),
                                  static_cast<std::uint64_t>(limit.count()), &error, &answer);
   // The bus says NoReply when the callee has died, which has the same number.

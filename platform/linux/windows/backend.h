@@ -31,27 +31,27 @@ struct Backend {
   /// Called before all others; null where nothing is to be prepared.
   void (*init)() = nullptr;
   /// Makes the connection, where there is none, at most once a turn of the run loop. Whether there is one.
-  bool (*open)();
+  bool (*open)() = nullptr;
   /// Closes the connection for good.
-  void (*close)();
+  void (*close)() = nullptr;
   /// Opens it and takes in what the window system has sent. True when the list has changed since the last
   /// call.
-  bool (*takeIn)();
+  bool (*takeIn)() = nullptr;
   /// The windows that the person has open, topmost first. Valid until takeIn.
-  const std::vector<Window>& (*list)();
+  const std::vector<Window>& (*list)() = nullptr;
   /// Brings up to date how windows of list() look, and their class.
-  void (*look)(std::span<Window> windows);
+  void (*look)(std::span<Window> windows) = nullptr;
   /// Whether it can tell which window is active.
-  bool (*knowsFront)();
+  bool (*knowsFront)() = nullptr;
   /// The same for who only looks as for who types.
-  Reach (*reach)();
+  Reach (*reach)() = nullptr;
   /// Asks for the window to come to the front.
-  void (*activate)(std::uint64_t window);
+  void (*activate)(std::uint64_t window) = nullptr;
   /// Sends a press or release of a key, an X keysym (which is what xkb names them), to a window within reach.
   /// False when the keyboard has no such key or the window is gone.
-  bool (*sendKey)(std::uint64_t window, std::uint32_t keysym, bool down, Modifiers modifiers);
+  bool (*sendKey)(std::uint64_t window, std::uint32_t keysym, bool down, Modifiers modifiers) = nullptr;
   /// In the pixels in which it tells the areas of windows.
-  std::vector<Output> (*outputs)();
+  std::vector<Output> (*outputs)() = nullptr;
 };
 
 /// Whether keys will be sent. A back end gets ready for them with the connection, as the first must not be

@@ -55,7 +55,7 @@ bool takesKeys(ID window);
 /// same ones, and does not know what else is there.
 std::vector<Output> outputs();
 
-/// Whether a shown full-screen window covers most of this output.
-bool isCaptured(std::uint32_t output);
+/// Whether a shown full-screen window covers most of the output with this number.
+bool isCaptured(std::uint32_t id);
 
 }  // namespace linux::windows

@@ -168,6 +168,7 @@ const Source kReports{
     .windows =
         [] {
           std::vector<Window> windows;
+          windows.reserve(sReported.size());
           for (const Reported& each : sReported) windows.push_back(each.window);
           return windows;
         },

@@ -27,16 +27,14 @@ void addPlaces(xkb_keymap* keymap, xkb_keycode_t code, void* data) {
     const xkb_keysym_t* symbols = nullptr;
     const xkb_level_index_t level = modifiers == kShift ? 1 : 0;
     if (code >= kEvdevOffset && xkb_keymap_key_get_syms_by_level(keymap, code, 0, level, &symbols) == 1) {
-      places.try_emplace(*symbols, code - kEvdevOffset, modifiers);
+      places.try_emplace(*symbols, Place{code - kEvdevOffset, modifiers});
     }
   }
 }
 
 using Context = std::unique_ptr<xkb_context, decltype(&xkb_context_unref)>;
 
-Context makeContext() {
-  return Context(xkb_context_new(XKB_CONTEXT_NO_ENVIRONMENT_NAMES), xkb_context_unref);
-}
+Context makeContext() { return {xkb_context_new(XKB_CONTEXT_NO_ENVIRONMENT_NAMES), xkb_context_unref}; }
 
 }  // namespace
 

@@ -28,7 +28,8 @@ void beginToplevels() { sIsBeginning = true; }
 
 void noteAllAreKnown() {
   sIsBeginning = false;
-  std::ranges::stable_partition(sToplevels, [](const auto& each) { return each->description.isActive; });
+  std::stable_partition(sToplevels.begin(), sToplevels.end(),
+                        [](const auto& each) { return each->description.isActive; });
 }
 
 Toplevel& addToplevel(void* handle) {

@@ -82,8 +82,8 @@ bool serverAnswers() {
   const pid_t child = fork();
   if (child < 0) return false;
   if (child == 0) {
-    if (xcb_connection_has_error(xcb_connect(nullptr, nullptr)) == 0) (void)!write(writing.get(), "", 1);
-    _exit(0);
+    const bool answers = xcb_connection_has_error(xcb_connect(nullptr, nullptr)) == 0;
+    _exit(answers && write(writing.get(), "", 1) == 1 ? 0 : 1);
   }
   writing = base::FileDescriptor();
   char byte = 0;
