@@ -5,6 +5,8 @@
 #include <string_view>
 #include <utility>
 
+#include "platform/text/utf8.h"
+
 namespace stage {
 
 namespace {
@@ -35,7 +37,7 @@ std::string shortened(std::string_view source) {
       body.remove_prefix(4);
     } else {
       body = body.substr(0, body.rfind('\n'));
-      body.remove_prefix(std::min<std::size_t>(body.size(), 1));
+      text::takeCharacter(body);
     }
   }
   // A doubled word means no more, and looks like a mistake.
@@ -48,7 +50,8 @@ std::string shortened(std::string_view source) {
     } else {
       text += c;
     }
-    if (text.size() > longest) return text + "…";
+    // No character is cut.
+    if (text.size() > longest && text::isUTF8(text)) return text + "…";
   }
   return text;
 }
