@@ -23,6 +23,9 @@ struct Told {
 /// have shown on the bus.
 std::optional<std::uint64_t> sBusy;
 
+/// No disc has so many titles or chapters: what is beyond is garbage.
+constexpr int kMostPlaces = 65'536;
+
 /// Finds "2/3" in a line, whatever the words around it and their language.
 std::optional<Place> placeIn(std::string_view line) {
   constexpr std::string_view kDigits = "0123456789";
@@ -33,7 +36,8 @@ std::optional<Place> placeIn(std::string_view line) {
   Place place;
   const char* const end = line.data() + line.size();
   if (std::from_chars(line.data() + first, end, place.number).ec != std::errc() ||
-      std::from_chars(line.data() + slash + 1, end, place.count).ec != std::errc()) {
+      std::from_chars(line.data() + slash + 1, end, place.count).ec != std::errc() ||
+      place.number > kMostPlaces) {
     return std::nullopt;
   }
   return place;
