@@ -16,29 +16,20 @@
 #include <string_view>
 #include <system_error>
 
+#include "platform/linux/programs/desktop_entry.h"
 #include "platform/linux/programs/entry.h"
-#include "platform/linux/programs/table.h"
 
 namespace {
 
 namespace files = std::filesystem;
 namespace programs = linux::programs;
-using programs::Role;
 
-constexpr const char* kCastKey = "X-Kvd-Application";
-/// What stands there instead of an identifier where the program takes the remote itself.
-constexpr const char* kOwnRemote = "own-remote";
 constexpr const char* kMusicTypes[] = {"audio/mpeg", "audio/flac", "audio/x-vorbis+ogg"};
 constexpr std::string_view kSuffix = ".desktop";
 
 /// In bytes: the largest real ones hold a name in every language and have a third of that. What is larger is
 /// no entry.
 constexpr std::uintmax_t kLargestFile = std::uintmax_t{256} * 1024;
-
-struct StringReleaser {
-  void operator()(char* text) const { g_free(text); }
-};
-using OwnedText = std::unique_ptr<char, StringReleaser>;
 
 struct ObjectReleaser {
   void operator()(gpointer object) const { g_object_unref(object); }
@@ -47,69 +38,15 @@ using OwnedInfo = std::unique_ptr<GDesktopAppInfo, ObjectReleaser>;
 
 std::string textOf(const char* text) { return text != nullptr ? text : ""; }
 
-std::string textOf(GDesktopAppInfo* info, const char* key) {
-  const OwnedText text(g_desktop_app_info_get_string(info, key));
-  return textOf(text.get());
-}
-
 std::string withoutSuffix(std::string id) {
   if (id.ends_with(kSuffix)) id.resize(id.size() - kSuffix.size());
   return id;
 }
 
-bool has(std::string_view categories, std::string_view category) {
-  for (std::size_t at = 0; at <= categories.size();) {
-    const std::size_t end = std::min(categories.find(';', at), categories.size());
-    if (categories.substr(at, end - at) == category) return true;
-    at = end + 1;
-  }
-  return false;
-}
-
-/// The role that the categories suggest (Desktop Menu Specification 1.1).
-Role roleByCategories(std::string_view categories) {
-  if (has(categories, "WebBrowser")) return Role::None;
-  if (has(categories, "Presentation")) return Role::Presentation;
-  if (has(categories, "Photography")) {
-    return has(categories, "Viewer") ? Role::PhotoLibrary : Role::ProfessionalPhotos;
-  }
-  if (!has(categories, "Player")) return Role::None;
-  if (has(categories, "Video")) return Role::ModernMovies;
-  return has(categories, "Audio") || has(categories, "Music") ? Role::Jukebox : Role::None;
-}
-
-/// Empty for a program that needs a terminal: it cannot be started without one.
-std::vector<std::string> commandOf(GDesktopAppInfo* info) {
-  std::vector<std::string> words;
-  gchar** arguments = nullptr;
-  const bool startable = g_desktop_app_info_get_boolean(info, "Terminal") == FALSE;
-  const char* const line = startable ? g_app_info_get_commandline(G_APP_INFO(info)) : nullptr;
-  if (line == nullptr || g_shell_parse_argv(line, nullptr, &arguments, nullptr) == FALSE) return words;
-  for (gchar** argument = arguments; *argument != nullptr; ++argument) words.emplace_back(*argument);
-  g_strfreev(arguments);
-  return programs::withoutFieldCodes(words);
-}
-
 void report(GDesktopAppInfo* info, const std::string& id) {
-  const programs::Program* const known = programs::programByEntry(id);
-  programs::Entry entry;
-  entry.id = id;
-  entry.cast = g_desktop_app_info_has_key(info, kCastKey) != FALSE;
-  if (entry.cast) {
-    entry.role = programs::roleOf(textOf(info, kCastKey));
-    entry.takesRemote = textOf(info, kCastKey) == kOwnRemote;
-  } else if (known != nullptr) {
-    entry.role = known->role;
-    entry.takesRemote = known->takesRemote;
-  } else {
-    entry.role = roleByCategories(textOf(g_desktop_app_info_get_categories(info)));
-  }
-  if (entry.role == Role::None && !entry.cast && !entry.takesRemote) return;
-  entry.windowClass = textOf(g_desktop_app_info_get_startup_wm_class(info));
-  entry.busActivatable = g_desktop_app_info_get_boolean(info, "DBusActivatable") != FALSE;
-  entry.directory = textOf(info, "Path");
-  entry.command = commandOf(info);
-  std::fputs(programs::toRecord(entry).c_str(), stdout);
+  const auto entry = programs::entryIn(info, id);
+  if (!entry) return;
+  std::fputs(programs::toRecord(*entry).c_str(), stdout);
   // Should this program be given up, kvd has what was found so far.
   std::fflush(stdout);
 }
