@@ -54,11 +54,16 @@ std::uint64_t numberOf(std::string_view uuid) {
   return known != sReported.end() ? known->window.id.number : ++sLastNumber;
 }
 
+/// A whole number; throws, as at() does, where something else is told.
+int numberIn(const Json& told, const char* member) {
+  return static_cast<int>(told.at(member).get_ref<const std::int64_t&>());
+}
+
 Reported readWindow(const Json& told) {
   const std::string uuid = told.at("uuid").get<std::string>();
   Window window;
   window.id.number = numberOf(uuid);
-  window.process = told.at("process").get<pid_t>();
+  window.process = numberIn(told, "process");
   window.className = told.at("class").get<std::string>();
   window.instanceName = told.at("instance").get<std::string>();
   const auto entry = told.at("entry").get<std::string>();
@@ -68,7 +73,7 @@ Reported readWindow(const Json& told) {
   window.isActive = told.at("active").get<bool>();
   window.isShown = told.at("shown").get<bool>();
   window.isFullScreen = told.at("full").get<bool>() && window.isShown;
-  if (window.isFullScreen) window.area = wayland::areaAt(told.at("x").get<int>(), told.at("y").get<int>());
+  if (window.isFullScreen) window.area = wayland::areaAt(numberIn(told, "x"), numberIn(told, "y"));
   return {uuid, window};
 }
 
