@@ -7,8 +7,10 @@
 #include <fstream>
 
 #include "platform/base/values.h"
+#include "platform/stage/journal.h"
 #include "platform/stage/report.h"
 #include "registry/bridge.h"
+#include "routing/target.h"
 #include "tests/core/rehearsal.h"
 #include "tests/temporary_directory.h"
 
@@ -100,6 +102,17 @@ TEST(Registry, TellsTheFrontmostApplication) {
                 return nobody + " " + front + " " + codeText(FrontProcessID()) + " " + stage::aliveText();
               }),
               "none " + std::string(code) + " none nothing");
+  }
+  for (AppCode (*const front)() : {FrontProcessID, FrontApplication}) {
+    EXPECT_EQ(inChild([&] {
+                set("open lyrabox; front lyrabox");
+                stage::setJournalListener([](const stage::JournalLine& line) {
+                  if (line.kind == stage::Entry::Question) set("close lyrabox");
+                });
+                return codeText(front()) + " " + stage::aliveText();
+              }),
+              "none nothing")
+        << "it quits while one asks";
   }
 }
 

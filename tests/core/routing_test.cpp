@@ -58,7 +58,12 @@ TEST(Target, IsFrontmostElsePlayingElseLastElseFirst) {
        {"close lyrabox", "Spin"}},
       // Priority alone is not remembered.
       {{"open com.tarn.Spindle", "Spin"}, {"open lyrabox", "Lyra"}, {"close lyrabox", "Spin"}},
-      // A photo application in front is a target, and forgotten when it leaves.
+      // What has quit is forgotten for good.
+      {{"open com.tarn.vistremeplayer; front com.tarn.vistremeplayer", "Vist"},
+       {"close com.tarn.vistremeplayer; open lyrabox", "Lyra"},
+       {"open com.tarn.vistremeplayer", "Lyra"}},
+      // A photo or slide application in front is a target, and forgotten when it leaves.
+      {{"open slidewell; front slidewell; open lyrabox", "Slid"}, {"front nobody", "Lyra"}},
       {{"open com.tarn.vistremeplayer; front com.tarn.vistremeplayer", "Vist"},
        {"open com.tarn.Snapvale; front com.tarn.Snapvale; open lyrabox", "Snap"},
        {"front nobody", "Lyra"}},
