@@ -12,7 +12,7 @@ window Page of firefox class=firefox-esr
 front Page
 tap play
   strawberry: PlayPause
-firefox: title=Film playing
+firefox: length=1h playing
 tap play
   strawberry: Pause
   firefox: Pause

@@ -10,6 +10,7 @@ player firefox as=firefox.instance_1 DesktopEntry=firefox title=Film
 start
 tell Lyrabox to play
   mpv: Play
+tell Lyrabox to activate
 tell Spindle to play dvd
   fails
 tell VistremePlayerX to play front document
@@ -25,7 +26,7 @@ tap right
   window Photos: key Right
 # Browsers, proxies and headsets whom nobody cast.
 quit newcomer
-player playerctld DesktopEntry=newcomer
+player playerctld DesktopEntry=mpv
 player chromium as=chromium.instance4711 DesktopEntry=newcomer
 player headset
 tell Lyrabox to play
@@ -48,7 +49,9 @@ close Film
 tell VistremePlayerX to activate
   proxy: Raise
 # A player with two names stays while it has one of them.
-player rhythmbox owns=org.mpris.MediaPlayer2.rhythmbox.instance7
+player rhythmbox playing owns=org.mpris.MediaPlayer2.rhythmbox.instance7
+tell Lyrabox to pause
+  rhythmbox: Pause
 rhythmbox: drops=org.mpris.MediaPlayer2.rhythmbox
 tell Lyrabox to play
   rhythmbox: PlayPause

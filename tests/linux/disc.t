@@ -32,7 +32,11 @@ tap next
 tap playpause
   vlc: Play
 # Scans: by VLC's rate forward, by seeking backward; begun while it stood still they end so.
-vlc: MaximumRate=30
+press forward
+wait 0.25s
+  +0.25s  vlc: SetPosition /track/1 1802s
+release forward
+vlc: Position=30m MaximumRate=30
 press forward
   vlc: Set Rate 8
 release forward

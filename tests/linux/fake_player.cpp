@@ -289,7 +289,7 @@ std::string talkLikeVlc(const std::string& line) {
   const std::string place = note("rc." + line);
   const bool paused = property("PlaybackStatus").value == "Paused";
   if (place.empty() || notes.contains("counts")) tell(0, "channel: " + line);
-  std::string reply = "status change: ( new input: file:///films/1/2.mkv )\r\n";
+  std::string reply = "status change: ( new input: 1/2.mkv )\r\n";
   if (!place.empty()) reply += paused ? "Press pause to continue.\r\n" : "Currently at " + place + ".\r\n";
   return reply + line + ": returned 0 (no error)\r\n";
 }

@@ -53,3 +53,8 @@ tell Lyrabox to play
 audacious: answers
 tell Lyrabox to get player state
   = 'kPSP'
+# An action of one that is too busy to tell of it is done all the same.
+program eog holds=Describe
+window Photo of eog class=eog
+tell Snapvale to start slideshow
+  eog: SetState win.view-slideshow true of Photo

@@ -17,6 +17,7 @@ tap previous
 audacious: playing Position=1m
 wait 1s
 press forward
+tell Lyrabox to fast forward
 wait 0.5s
   +0.25s  audacious: SetPosition /track/1 62s
   +0.5s  audacious: SetPosition /track/1 64s
