@@ -6,7 +6,7 @@ entry newcomer Categories=AudioVideo;Audio;Player;
 entry organiser Categories=Graphics;Photography;
 player mpv DesktopEntry=mpv
 player vlc DesktopEntry=vlc
-player firefox as=firefox.instance_1 DesktopEntry=firefox title=Film
+player firefox as=firefox.instance_1 DesktopEntry=firefox title=Film stopped
 start
 tell Lyrabox to play
   mpv: Play
@@ -16,7 +16,7 @@ tell Spindle to play dvd
 tell VistremePlayerX to play front document
   firefox: Play
 quit mpv
-player newcomer DesktopEntry=newcomer.desktop
+player newcomer DesktopEntry=Newcomer.desktop
 tell Lyrabox to play
   newcomer: Play
 program organiser
@@ -31,9 +31,20 @@ player chromium as=chromium.instance4711 DesktopEntry=newcomer
 player headset
 tell Lyrabox to play
   fails
+player phone as=kdeconnect.mpris_1 DesktopEntry=mpv
+tell Lyrabox to play
+  phone: Play
+quit phone
+# In another role a program is not what its row says.
+entry org.gnome.eog X-Kvd-Application=com.tarn.Officra.Slidewell
+program eog
+window Show of eog class=eog full-screen
+tell Slidewell to get playing
+  = 1
+quit eog
 
 # A sandboxed player speaks through a proxy, so that its window has another process: its entry tells whose it is.
-player proxy as=totem title=Film DesktopEntry=org.gnome.Totem
+player proxy as=sandboxed title=Film DesktopEntry=org.gnome.Totem
 program sandbox
 window Film of sandbox id=org.gnome.Totem
 front Film

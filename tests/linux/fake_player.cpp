@@ -236,8 +236,9 @@ std::string textOf(sd_bus_message* call) {
   std::string text = sd_bus_message_get_member(call);
   std::vector<std::string> words = argumentsOf(call);
   if (text == "Set") words.erase(words.begin());
-  if (sd_bus_message_get_interface(call) == std::string_view("org.gtk.Actions")) {
-    words.front().insert(0, "win.");
+  const std::string_view interface = sd_bus_message_get_interface(call);
+  if (interface == "org.gtk.Actions") words.front().insert(0, "win.");
+  if (interface == "org.gtk.Actions" || interface == "org.freedesktop.Application") {
     const std::string path = sd_bus_message_get_path(call);
     words.push_back("of " + path.substr(path.rfind('/') + 1));
   }
