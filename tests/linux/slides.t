@@ -13,6 +13,7 @@ tap play
   strawberry: Pause
   window Talk: key F5
 window Show of office class=libreoffice-impress full-screen
+tell Slidewell to start slideshow
 tap next
   window Show: key Right
 press rewind
@@ -46,6 +47,11 @@ tap play
 window Show of office class=libreoffice-impress full-screen
 tap playpause
   window Show: key b
+tell Slidewell to set frozen to true
+close Show
+window Show of office class=libreoffice-impress full-screen
+tell Slidewell to get frozen
+  = 0
 window Show hidden
 tap play
   window Talk: key F5
