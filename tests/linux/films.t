@@ -33,9 +33,14 @@ press forward
 release forward
   mpv: Set Rate 1
 
-# A step is one frame, over mpv's channel, else by its key.
+# A step is one frame, over mpv's channel, else by its key. It ends a scan.
+press forward
+  mpv: Set Rate 2
 tap next
+  mpv: Set Rate 1
   window Dune: key .
+release forward
+  mpv: Set Rate 1
 mpv: channel=mpv-socket refuses=frame-step
 tell VistremePlayer to step forward front movie
   mpv: channel: frame-step
@@ -55,6 +60,11 @@ front Dune
 tap next
   window Dune: key .
 quit wrapper
+# Without a film there is nothing to play.
+player empty as=mpv stopped
+tell VistremePlayer to play front movie
+  fails
+quit empty
 
 # The modern movie player climbs through its rates, and answers on the screen: in a notification that takes the
 # place of the one before, or in its own picture.
@@ -91,7 +101,13 @@ player showtime as=org.gnome.Showtime length=7.2s Position=0.06s playing
 tap next
   desk: Notify kvd 7 org.gnome.Showtime Showtime 1:00 / 2:00:00 2000
   showtime: SetPosition /track/1 0.07s
-showtime: length=2h Position=1m
+showtime: length=1h Position=1m
 tap next
-  desk: Notify kvd 7 org.gnome.Showtime Showtime 1:00 / 2:00:00 2000
+  desk: Notify kvd 7 org.gnome.Showtime Showtime 1:00 / 1:00:00 2000
   showtime: SetPosition /track/1 70s
+tap previous
+  desk: Notify kvd 7 org.gnome.Showtime Showtime 1:10 / 1:00:00 2000
+  showtime: SetPosition /track/1 60s
+  desk: Notify kvd 7 org.gnome.Showtime Showtime 1:00 / 1:00:00 2000
+tell VistremePlayerX to set audio volume of front document to 2
+  showtime: Set Volume 1

@@ -158,8 +158,11 @@ vlc: Position:s=soon PlaybackStatus:d=1 Metadata:s=none
 wait 1s
 tell Spindle to get elapsed time
   = 0
+tell Spindle to get dvd state
+  = 'esid'
+vlc: Tracks=/track/1,/track/2
 tell Spindle to get has media
-  = 0
+  = 1
 quit vlc
 # A length of nothing is none. What does not say that it can seek cannot, and neither can what is stopped.
 player audacious length=0s Position=1m playing

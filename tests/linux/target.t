@@ -112,3 +112,22 @@ lock off
 tap play
   starter: Activate of Hi_Fi
 tap play
+# What runs is not started again, and comes to the front; whoever was set something was spoken to.
+wait 20s
+player rhythmbox
+tell Lyrabox to launch
+player elisa
+tell Lyrabox to play
+  elisa: Play
+window Tune of rhythmbox class=rhythmbox
+front Tune
+tell Lyrabox to set sound volume to 50
+  rhythmbox: Set Volume 0.5
+elisa: paused
+front nobody
+tell Lyrabox to next track
+  rhythmbox: Next
+quit elisa
+quit rhythmbox
+tell Lyrabox to activate
+  starter: Activate of Hi_Fi
