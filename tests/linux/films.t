@@ -111,3 +111,8 @@ tap previous
   desk: Notify kvd 7 org.gnome.Showtime Showtime 1:00 / 1:00:00 2000
 tell VistremePlayerX to set audio volume of front document to 2
   showtime: Set Volume 1
+showtime: Volume=0.7
+tell VistremePlayerX to get audio volume of front document
+  = 0
+tell VistremePlayerX to stop front document
+  showtime: Pause

@@ -63,6 +63,8 @@ release forward
 press rewind
 wait 0.25s
   +0.25s  audacious: SetPosition /track/2 14s
+tell Lyrabox to get player state
+  = 'kPSR'
 release rewind
 tell Lyrabox to get player state
   = 'kPSU'
