@@ -174,9 +174,13 @@ wait 1s
 audacious: stopped
 tell Lyrabox to fast forward
   fails
-audacious: CanSeek:s=yes playing
+audacious: CanSeek:s=yes Volume=1.5 playing
 tell Lyrabox to fast forward
   fails
+tap previous
+  audacious: Previous
+tell Lyrabox to get sound volume
+  = 100
 # After a step nobody knows what it does, and it is asked.
 audacious: silent
 tap next

@@ -25,6 +25,11 @@ tell Lyrabox to get player state
   = 'kPSF'
 release forward
 wait 1s
+press forward
+tap next
+  audacious: Next
+wait 1s
+release forward
 # Backward it ends where the track begins, forward a second before its end, though the button is still down.
 audacious: Position=3s
 press rewind

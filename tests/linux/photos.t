@@ -20,7 +20,7 @@ outputs 0,0,1280,720 1280,0,1920,1080
 window Cat full-screen area=1300,0,1500,1080
 tap play
   eog: Activate win.pause-slideshow of Cat
-window Cat area=1200,0,200,200
+window Cat area=1280,0,960,1080
 tap play
   window Cat: activate
   eog: SetState win.view-slideshow true of Cat

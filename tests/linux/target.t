@@ -127,6 +127,11 @@ elisa: paused
 front nobody
 tell Lyrabox to next track
   rhythmbox: Next
+elisa: playing
+rhythmbox: playing
+tell Lyrabox to pause
+  elisa: Pause
+  rhythmbox: Pause
 quit elisa
 quit rhythmbox
 tell Lyrabox to activate
