@@ -29,6 +29,7 @@ quit newcomer
 player playerctld DesktopEntry=mpv
 player chromium as=chromium.instance4711 DesktopEntry=newcomer
 player headset
+player handset as=kdeconnect.mpris_2 DesktopEntry=newcomer
 tell Lyrabox to play
   fails
 player phone as=kdeconnect.mpris_1 DesktopEntry=mpv

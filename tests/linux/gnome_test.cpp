@@ -125,6 +125,10 @@ TEST(Gnome, KeysGoThroughASessionThatMayEnd) {
   kBackend.takeIn();
   const auto window = [](std::size_t which) { return kBackend.list().at(which).id.number; };
   EXPECT_TRUE(kBackend.list()[0].isFullScreen && !kBackend.list()[0].isDialog);
+  windows::Window gone = kBackend.list()[0];
+  gone.id.number = 9;
+  kBackend.look({&gone, 1});
+  EXPECT_FALSE(gone.isFullScreen);
   EXPECT_FALSE(kBackend.sendKey(window(1), 'm', true, windows::kNoModifier)) << "it is not in front";
   EXPECT_TRUE(kBackend.sendKey(window(0), 'm', true, windows::kShift));
   EXPECT_TRUE(kBackend.sendKey(window(1), 'm', false, windows::kShift)) << "owed all the same";

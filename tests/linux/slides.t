@@ -68,6 +68,8 @@ tap play
   window Talk: key F5
 # The window is the same, but it is a sheet now.
 close Show
+tell Slidewell to get playing
+  = 0
 window Talk class=libreoffice-calc
 tap play
   strawberry: PlayPause
