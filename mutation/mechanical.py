@@ -107,7 +107,7 @@ def changed_statements(tokens, ends, text):
             statement = text[start:tokens[stop][1]]
             if token == "return" and statement not in ("return", "return 0", "return false", "return nullptr"):
                 yield start, tokens[stop][1], "return {}"
-            elif re.fullmatch(r"return|break|continue", statement) or re.match(r"[\w:.>*\[\]-]+ ?(\(|[-+|&]?= )", statement):
+            elif re.match(r"(return|break|continue)$|[\w:.>*\[\]-]+ ?(\(|[-+|&]?= )", statement):
                 if tokens[i - 1][0] != ")":  # that is what "if (false)" does
                     yield start, tokens[stop][2], ""
 
@@ -125,7 +125,8 @@ def exchanged_names(tokens, text):
         row = re.search(r"\{[^(;]*$", text[text.rindex("\n", 0, start) + 1:start]) if "\n" in text[:start] else None
         for kind, names in kinds.items():
             names = sorted(set(names))
-            if token in names and len(names) > 1 and qualified == (kind == tokens[i - 2][0]) and not declared and not row:
+            of_kind = token in names and len(names) > 1 and qualified == (kind == tokens[i - 2][0])
+            if of_kind and not declared and not row:
                 yield start, end, names[(names.index(token) + 1) % len(names)]
 
 
