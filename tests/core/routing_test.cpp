@@ -69,6 +69,15 @@ TEST(Target, IsFrontmostElsePlayingElseLastElseFirst) {
        {"front nobody", "Lyra"}},
       // A disc player that shows its menu counts as playing.
       {{"open lyrabox; open spindle; tell spindle to go to main menu", "Spin"}},
+      // Of those that play, the first in an order of its own.
+      {{"open lyrabox; tell lyrabox to play; open spindle; tell spindle to play dvd; open VistremePlayerX; "
+        "tell VistremePlayerX to play front document; open com.tarn.vistremeplayer; "
+        "tell com.tarn.vistremeplayer to play front movie; open slidewell; tell slidewell to start slideshow",
+        "Lyra"},
+       {"tell lyrabox to stop", "Spin"},
+       {"tell spindle to stop dvd", "VstX"},
+       {"tell VistremePlayerX to stop front document", "Vist"},
+       {"tell com.tarn.vistremeplayer to stop front movie", "Slid"}},
       // Paused is not playing.
       {{"open lyrabox; open com.tarn.Spindle; front com.tarn.Spindle; tell lyrabox to play; tell lyrabox to "
         "pause",
