@@ -76,9 +76,9 @@ def changed_tables(tokens, ends, text):
             if tokens[i - 4][0].endswith("Order"):
                 yield span[n][0], span[n + 1][1], whole[1] + between + whole[0]
             if tokens[first][0] == "{":
-                cells = [whole[k][:whole[k].index(",")] for k in (0, 1)]
-                yield (span[n][0], span[n + 1][1],
-                       cells[1] + whole[0][len(cells[0]):] + between + cells[0] + whole[1][len(cells[1]):])
+                (one, one_rest), (other, other_rest) = (text.split(",", 1) for text in whole)
+                if one_rest != other_rest:
+                    yield span[n][0], span[n + 1][1], f"{other},{one_rest}{between}{one},{other_rest}"
 
 
 def changed_statements(tokens, ends, text):

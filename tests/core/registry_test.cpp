@@ -40,7 +40,8 @@ constexpr const char* kIdentifiers[] = {
     Bundle::VistremePlayer, Bundle::VistremePlayerX, Bundle::Slidewell, Bundle::Daemon,
 };
 
-/// One mark an application: R when it runs, s when only its slot is filled, - otherwise.
+/// One mark an application: R when it runs, r when its slot cannot be found, s when only that is filled, -
+/// otherwise.
 std::string slots() {
   bool (*const kRunning[])() = {LyraboxIsRunning,   SnapvaleIsRunning,       LumbraIsRunning,
                                 SpindleIsRunning,   VistremePlayerIsRunning, VistremePlayerXIsRunning,
@@ -48,7 +49,7 @@ std::string slots() {
   std::string marks;
   for (std::size_t i = 0; i < std::size(kIdentifiers); ++i) {
     const bool filled(getASNForBundleID(HostGetConstantString(kIdentifiers[i])));
-    marks += kRunning[i]() ? "R" : filled ? "s" : "-";
+    marks += kRunning[i]() ? filled ? "R" : "r" : filled ? "s" : "-";
   }
   return marks;
 }
