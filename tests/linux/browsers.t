@@ -18,6 +18,13 @@ tap play
   firefox: Pause
 tap play
   firefox: Play
+# It says that it can play faster, and does not.
+firefox: MaximumRate=4
+press forward
+wait 0.25s
+  +0.25s  firefox: SetPosition /track/1 0.5s
+tap play
+wait 1s
 tell VistremePlayerX to close front document
   firefox: Pause
 firefox: stopped
