@@ -100,7 +100,8 @@ TEST(Registry, TellsTheFrontmostApplication) {
                 set(std::string("open ") + identifier + "; front " + identifier);
                 const std::string front = codeText(FrontProcessID());
                 sEndsMeanwhile = true;
-                return nobody + " " + front + " " + codeText(FrontProcessID()) + " " + stage::aliveText();
+                const std::string gone = codeText(FrontProcessID());
+                return nobody + " " + front + " " + gone + " " + stage::aliveText();
               }),
               "none " + std::string(code) + " none nothing");
   }
@@ -110,7 +111,8 @@ TEST(Registry, TellsTheFrontmostApplication) {
                 stage::setJournalListener([](const stage::JournalLine& line) {
                   if (line.kind == stage::Entry::Question) set("close lyrabox");
                 });
-                return codeText(front()) + " " + stage::aliveText();
+                const std::string code = codeText(front());
+                return code + " " + stage::aliveText();
               }),
               "none nothing")
         << "it quits while one asks";
