@@ -57,6 +57,8 @@ front Editor
 tell Snapvale to select album 5
   window Editor: key Left
 keys any
+tell Keyhouse to key code 36 using command down
+  fails
 # Who was spoken to last goes before who came last.
 program gthumb
 window Album of gthumb class=gthumb
@@ -86,5 +88,3 @@ tap right
   window Shoot: key Right
 tell Keyhouse to key code 36 using option down
   window Shoot: key Return
-tell Keyhouse to key code 36 using command down
-  fails
