@@ -37,11 +37,13 @@ HostListRef HostFindRunningApplications(HostSessionID session, std::size_t count
                                         HostObject* const* values) {
   if (session != kHostDefaultSession) return nullptr;
   std::vector<HostObject*> found;
+  const stage::Application* application = nullptr;
   for (const stage::Process& process : stage::desktop().running) {
     if (!base::hasInformation(instanceOf(process), count, keys, values)) continue;
-    if (found.empty()) record(Entry::Question, "finds " + process.application->name + " running");
+    application = process.application;
     found.push_back(new base::SerialNumber(process.serialNumber));
   }
+  if (application != nullptr) record(Entry::Question, "finds " + application->name + " running");
   return HostListRef(new base::List(std::move(found)));
 }
 
@@ -64,7 +66,7 @@ HostObject* HostCopyApplicationInformationItem(HostSessionID session, HostSerial
 }
 
 HostSerialNumberRef HostCopyFrontApplication(HostSessionID session) {
-  const auto& front = stage::desktop().front;
+  const auto front = stage::desktop().front;  // whoever hears of the question may change it
   if (session != kHostDefaultSession) return nullptr;
   recordQuestion(Question::WhoIsInFront,
                  "asks who is in front: " + (front ? front->application->name : std::string("nobody")),

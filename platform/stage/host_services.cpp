@@ -17,6 +17,8 @@ using stage::record;
 constexpr std::int32_t kTransactionTracking = 16;
 constexpr std::int32_t kNoSuchProcess = -600;
 constexpr std::int32_t kBadEvent = -50;
+constexpr std::int32_t kNoReply = 1;
+constexpr std::int32_t kOwnTimeOut = -1;
 
 }  // namespace
 
@@ -37,16 +39,19 @@ void HostPostDistributedNotification(HostStringRef name, HostStringRef object,
                                   (deliverImmediately ? " at once" : ""));
 }
 
-std::int32_t HostSendEvent(const HostEventDescriptor* event, HostEventDescriptor*, std::int32_t,
-                           std::int32_t) {
+std::int32_t HostSendEvent(const HostEventDescriptor* event, HostEventDescriptor*, std::int32_t sendMode,
+                           std::int32_t timeout) {
   const auto target = base::targetOf(event);
   if (!target) return kBadEvent;
   const stage::Process* const process = stage::findProcess(*target);
   if (process == nullptr) return kNoSuchProcess;
   const auto* const contents = base::as<base::EventContents>(event->contents);
   stage::Application& application = *process->application;
+  const bool usual = contents->returnID > 0 && contents->transactionID == 0 && sendMode == kNoReply &&
+                     timeout == kOwnTimeOut;
   record(Entry::Event, "event " + stage::quoted(contents->eventClass) + "/" +
-                           stage::quoted(contents->eventID) + " to " + application.name);
+                           stage::quoted(contents->eventID) + " to " + application.name +
+                           (usual ? "" : ", with a reply, a time or an id of its own"));
   application.receiveEvent(contents->eventClass, contents->eventID);
   return 0;
 }

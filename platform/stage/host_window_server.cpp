@@ -1,6 +1,7 @@
 // The window server's side of the host interface: sound keys, keys for one process, displays.
 
 #include <algorithm>
+#include <sstream>
 #include <string>
 
 #include "platform/base/event_record.h"
@@ -48,8 +49,9 @@ HostConnectionID HostConnectWindowServer() {
 
 std::int32_t HostSetLocalEventsSuppressionInterval(HostConnectionID connection, double seconds) {
   if (connection != kConnection) return -1;
-  record(Entry::Service, "holds the user's own input back for " + std::to_string(static_cast<int>(seconds)) +
-                             " s after a synthetic event");
+  std::ostringstream text;
+  text << "holds the user's own input back for " << seconds << " s after a synthetic event";
+  record(Entry::Service, text.str());
   return 0;
 }
 
@@ -101,12 +103,12 @@ std::int32_t HostFindProcessByBundleIdentifier(HostStringRef bundleIdentifier, s
 
 std::int32_t HostGetActiveDisplayList(std::uint32_t capacity, HostDisplayID* displays, std::uint32_t* count) {
   *count = 0;
-  if (stage::desktop().broken.displayQuery) return -1;
   for (const stage::Display& display : stage::desktop().displays) {
     if (*count == capacity) break;
     displays[(*count)++] = display.id;
   }
-  return 0;
+  // What a failure leaves behind is not to be looked at.
+  return stage::desktop().broken.displayQuery ? -1 : 0;
 }
 
 std::uint32_t HostDisplayIsCaptured(HostDisplayID id) {

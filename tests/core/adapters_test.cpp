@@ -300,14 +300,15 @@ TEST(Buttons, OfTheProfessionalPhotoApplication) {
 TEST(Buttons, ScanAndReturnToWhatWasBefore) {
   EXPECT_EQ(played(kSpin, kPlaysDisc, {"Forward 1", "Forward 0"}),
             "menu?; state?; scan forward; +; menu?; play dvd; +; ");
-  EXPECT_EQ(played(kSpin, kPausesDisc, {"Rewind 1", "Rewind 0"}),
-            "menu?; state?; scan back; +; menu?; pause dvd; +; ");
+  EXPECT_EQ(played(kSpin, kPausesDisc, {"Rewind 1", "Rewind 0", "Forward 0"}),
+            "menu?; state?; scan back; +; menu?; pause dvd; +; menu?; pause dvd; +; ");
   EXPECT_EQ(played(kSpin, kPausesDisc, {"Forward -1", kShowsMenu, "Forward 1", "Rewind 0",
                                         "tell spindle to go return to dvd", "Forward 0"}),
             "menu?; state?; scan forward; +; menu?; fast forward dvd; +; menu?; +; menu?; pause dvd; +; ");
   EXPECT_EQ(played(kVist, "tell com.tarn.vistremeplayer to play front movie",
-                   {"Forward 1", "Rewind 0", "Pause 1", "Rewind 1", "Forward 0"}),
+                   {"Forward 1", "Rewind 0", "Forward 0", "Pause 1", "Rewind 1", "Forward 0"}),
             "playing?; set rate of front movie to 2.0; +; set rate of front movie to 1.0; +; "
+            "set rate of front movie to 1.0; +; "
             "pause front movie; +; "
             "playing?; set rate of front movie to -2.0; +; set rate of front movie to 0.0; +; ");
   EXPECT_EQ(played(kVstX, kRate + "1", {"Forward 1", "Forward 0", "Forward 1", "Rewind 1", "PlayPause 1"}),

@@ -7,8 +7,10 @@
 #include <fstream>
 
 #include "platform/base/values.h"
+#include "platform/stage/journal.h"
 #include "platform/stage/report.h"
 #include "registry/bridge.h"
+#include "routing/target.h"
 #include "tests/core/rehearsal.h"
 #include "tests/temporary_directory.h"
 
@@ -38,7 +40,8 @@ constexpr const char* kIdentifiers[] = {
     Bundle::VistremePlayer, Bundle::VistremePlayerX, Bundle::Slidewell, Bundle::Daemon,
 };
 
-/// One mark an application: R when it runs, s when only its slot is filled, - otherwise.
+/// One mark an application: R when it runs, r when its slot cannot be found, s when only that is filled, -
+/// otherwise.
 std::string slots() {
   bool (*const kRunning[])() = {LyraboxIsRunning,   SnapvaleIsRunning,       LumbraIsRunning,
                                 SpindleIsRunning,   VistremePlayerIsRunning, VistremePlayerXIsRunning,
@@ -46,7 +49,7 @@ std::string slots() {
   std::string marks;
   for (std::size_t i = 0; i < std::size(kIdentifiers); ++i) {
     const bool filled(getASNForBundleID(HostGetConstantString(kIdentifiers[i])));
-    marks += kRunning[i]() ? "R" : filled ? "s" : "-";
+    marks += kRunning[i]() ? filled ? "R" : "r" : filled ? "s" : "-";
   }
   return marks;
 }
@@ -97,9 +100,22 @@ TEST(Registry, TellsTheFrontmostApplication) {
                 set(std::string("open ") + identifier + "; front " + identifier);
                 const std::string front = codeText(FrontProcessID());
                 sEndsMeanwhile = true;
-                return nobody + " " + front + " " + codeText(FrontProcessID()) + " " + stage::aliveText();
+                const std::string gone = codeText(FrontProcessID());
+                return nobody + " " + front + " " + gone + " " + stage::aliveText();
               }),
               "none " + std::string(code) + " none nothing");
+  }
+  for (AppCode (*const front)() : {FrontProcessID, FrontApplication}) {
+    EXPECT_EQ(inChild([&] {
+                set("open lyrabox; front lyrabox");
+                stage::setJournalListener([](const stage::JournalLine& line) {
+                  if (line.kind == stage::Entry::Question) set("close lyrabox");
+                });
+                const std::string code = codeText(front());
+                return code + " " + stage::aliveText();
+              }),
+              "none nothing")
+        << "it quits while one asks";
   }
 }
 

@@ -58,12 +58,26 @@ TEST(Target, IsFrontmostElsePlayingElseLastElseFirst) {
        {"close lyrabox", "Spin"}},
       // Priority alone is not remembered.
       {{"open com.tarn.Spindle", "Spin"}, {"open lyrabox", "Lyra"}, {"close lyrabox", "Spin"}},
-      // A photo application in front is a target, and forgotten when it leaves.
+      // What has quit is forgotten for good.
+      {{"open com.tarn.vistremeplayer; front com.tarn.vistremeplayer", "Vist"},
+       {"close com.tarn.vistremeplayer; open lyrabox", "Lyra"},
+       {"open com.tarn.vistremeplayer", "Lyra"}},
+      // A photo or slide application in front is a target, and forgotten when it leaves.
+      {{"open slidewell; front slidewell; open lyrabox", "Slid"}, {"front nobody", "Lyra"}},
       {{"open com.tarn.vistremeplayer; front com.tarn.vistremeplayer", "Vist"},
        {"open com.tarn.Snapvale; front com.tarn.Snapvale; open lyrabox", "Snap"},
        {"front nobody", "Lyra"}},
       // A disc player that shows its menu counts as playing.
       {{"open lyrabox; open spindle; tell spindle to go to main menu", "Spin"}},
+      // Of those that play, the first in an order of its own.
+      {{"open lyrabox; tell lyrabox to play; open spindle; tell spindle to play dvd; open VistremePlayerX; "
+        "tell VistremePlayerX to play front document; open com.tarn.vistremeplayer; "
+        "tell com.tarn.vistremeplayer to play front movie; open slidewell; tell slidewell to start slideshow",
+        "Lyra"},
+       {"tell lyrabox to stop", "Spin"},
+       {"tell spindle to stop dvd", "VstX"},
+       {"tell VistremePlayerX to stop front document", "Vist"},
+       {"tell com.tarn.vistremeplayer to stop front movie", "Slid"}},
       // Paused is not playing.
       {{"open lyrabox; open com.tarn.Spindle; front com.tarn.Spindle; tell lyrabox to play; tell lyrabox to "
         "pause",

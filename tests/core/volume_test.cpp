@@ -111,15 +111,20 @@ std::string rehearsed(const std::string& before, const std::string& commands) {
 }
 
 const std::string kVolume0 = "script: output volume of (get volume settings) = 0";
+const std::string kVolume100 = "script: output volume of (get volume settings) = 100 | "
+                               "script: output muted of (get volume settings) = false | sound key up pressed | ";
+const std::string kRaise = "script to Lyrabox: set sound volume to sound volume + 2 = 102";
 
 TEST(Repeat, OfAVolumeButtonEndsAfterTenSecondsOrAtTheNextEvent) {
-  EXPECT_EQ(rehearsed("open lyrabox\nfront lyrabox\nvolume 0", "raw 0x01 0x8D 7 0xFFFE\nwait 15s\n"
-                      "lock on\nbreak event-records\npress up\nwait 1.2s\nrelease menu\nwait 5s"),
+  EXPECT_EQ(rehearsed("open lyrabox\nfront lyrabox\nvolume 0\ntell lyrabox to set sound volume to 100",
+                      "raw 0x01 0x8D 7 0xFFFE\nwait 15s\n"
+                      "lock on\nvolume 100\npress up\nlock off\nwait 1.2s\nrelease menu\nwait 5s"),
             "raw 0x01 0x8D 7 0xFFFE | " + kVolume0 + " | sound key down pressed | timer of 0.1s starts | "
             "wait 15s | +1.05s to +9.95s  ×90: | repeats ea000c by 7 | " + kVolume0 +
             " | sound key down pressed, repeated | +10.05s  timer of 0.1s stops | "
-            "lock on | break event-records | press up | " + kVolume0 + " | timer of 0.1s starts | "
-            "wait 1.2s | +1.05s to +1.15s  ×2: | repeats e9000c by 1, locked | " + kVolume0 +
+            "lock on | volume 100 | output volume 0 → 100 | press up | " + kVolume100 +
+            "asks who is in front: Lyrabox | " + kRaise + " | timer of 0.1s starts | lock off | wait 1.2s | "
+            "+1.05s to +1.15s  ×2: | repeats e9000c by 1, locked | " + kVolume100 + kRaise +
             " | release menu | timer of 0.1s stops | asks who is in front: Lyrabox | wait 5s");
   EXPECT_EQ(inChild([] {
               retrigger({0x0C, 0xE9, 0}, 0, 0.1, 10);

@@ -12,12 +12,19 @@ window Page of firefox class=firefox-esr
 front Page
 tap play
   strawberry: PlayPause
-firefox: title=Film playing
+firefox: length=1h playing
 tap play
   strawberry: Pause
   firefox: Pause
 tap play
   firefox: Play
+# It says that it can play faster, and does not.
+firefox: MaximumRate=4
+press forward
+wait 0.25s
+  +0.25s  firefox: SetPosition /track/1 0.5s
+tap play
+wait 1s
 tell VistremePlayerX to close front document
   firefox: Pause
 firefox: stopped

@@ -6,16 +6,17 @@ entry newcomer Categories=AudioVideo;Audio;Player;
 entry organiser Categories=Graphics;Photography;
 player mpv DesktopEntry=mpv
 player vlc DesktopEntry=vlc
-player firefox as=firefox.instance_1 DesktopEntry=firefox title=Film
+player firefox as=firefox.instance_1 DesktopEntry=firefox title=Film stopped
 start
 tell Lyrabox to play
   mpv: Play
+tell Lyrabox to activate
 tell Spindle to play dvd
   fails
 tell VistremePlayerX to play front document
   firefox: Play
 quit mpv
-player newcomer DesktopEntry=newcomer.desktop
+player newcomer DesktopEntry=Newcomer.desktop
 tell Lyrabox to play
   newcomer: Play
 program organiser
@@ -25,14 +26,26 @@ tap right
   window Photos: key Right
 # Browsers, proxies and headsets whom nobody cast.
 quit newcomer
-player playerctld DesktopEntry=newcomer
+player playerctld DesktopEntry=mpv
 player chromium as=chromium.instance4711 DesktopEntry=newcomer
 player headset
+player handset as=kdeconnect.mpris_2 DesktopEntry=newcomer
 tell Lyrabox to play
   fails
+player phone as=kdeconnect.mpris_1 DesktopEntry=mpv
+tell Lyrabox to play
+  phone: Play
+quit phone
+# In another role a program is not what its row says.
+entry org.gnome.eog X-Kvd-Application=com.tarn.Officra.Slidewell
+program eog
+window Show of eog class=eog full-screen
+tell Slidewell to get playing
+  = 1
+quit eog
 
 # A sandboxed player speaks through a proxy, so that its window has another process: its entry tells whose it is.
-player proxy as=totem title=Film DesktopEntry=org.gnome.Totem
+player proxy as=sandboxed title=Film DesktopEntry=org.gnome.Totem
 program sandbox
 window Film of sandbox id=org.gnome.Totem
 front Film
@@ -48,7 +61,9 @@ close Film
 tell VistremePlayerX to activate
   proxy: Raise
 # A player with two names stays while it has one of them.
-player rhythmbox owns=org.mpris.MediaPlayer2.rhythmbox.instance7
+player rhythmbox playing owns=org.mpris.MediaPlayer2.rhythmbox.instance7
+tell Lyrabox to pause
+  rhythmbox: Pause
 rhythmbox: drops=org.mpris.MediaPlayer2.rhythmbox
 tell Lyrabox to play
   rhythmbox: PlayPause

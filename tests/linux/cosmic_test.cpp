@@ -27,14 +27,14 @@ const struct ext_foreign_toplevel_list_v1_interface kListRequests { .stop = igno
 const struct ext_foreign_toplevel_handle_v1_interface kHandleRequests { .destroy = destroy };
 const struct zcosmic_toplevel_handle_v1_interface kDetailsRequests { .destroy = destroy };
 
-/// The first that is asked for is in front, and covers the output.
+/// The second that is asked for is in front, and covers the output.
 void describe(wl_client* client, wl_resource*, std::uint32_t id, wl_resource*) {
   wl_resource* const details = wl_resource_create(client, &zcosmic_toplevel_handle_v1_interface, 2, id);
   wl_resource_set_implementation(details, &kDetailsRequests, nullptr, nullptr);
   zcosmic_toplevel_handle_v1_send_output_enter(details, sOutput);
   std::uint32_t states[] = {ZCOSMIC_TOPLEVEL_HANDLE_V1_STATE_ACTIVATED,
                             ZCOSMIC_TOPLEVEL_HANDLE_V1_STATE_FULLSCREEN};
-  wl_array told{.size = sFirst ? sizeof states : 0, .alloc = 0, .data = states};
+  wl_array told{.size = sFirst ? 0 : sizeof states, .alloc = 0, .data = states};
   zcosmic_toplevel_handle_v1_send_state(details, &told);
   sFirst = false;
   zcosmic_toplevel_info_v1_send_done(sInfo);
@@ -83,16 +83,18 @@ TEST(Cosmic, ItsWindowsAreKnown) {
     windows::takeIn();
   }
   const windows::ID front[] = {windows::front()->id};
-  EXPECT_EQ(windows::look(front).at(0).title, "Dune");
+  EXPECT_EQ(windows::look(front).at(0).title, "Jaws");
   EXPECT_EQ(windows::list()[0].id, front[0]) << "topmost";
   EXPECT_EQ(windows::list()[1].applicationID, "mpv");
   ASSERT_EQ(windows::outputs().size(), 1U);
   EXPECT_TRUE(windows::isCaptured(windows::outputs()[0].id));
-  windows::finish();
-  EXPECT_TRUE(windows::list().empty());
   wl_display_terminate(display);
   server.join();
+  wl_display_destroy_clients(display);
   wl_display_destroy(display);
+  windows::takeIn();
+  EXPECT_TRUE(windows::list().empty());
+  windows::finish();
 }
 
 }  // namespace

@@ -236,8 +236,9 @@ std::string textOf(sd_bus_message* call) {
   std::string text = sd_bus_message_get_member(call);
   std::vector<std::string> words = argumentsOf(call);
   if (text == "Set") words.erase(words.begin());
-  if (sd_bus_message_get_interface(call) == std::string_view("org.gtk.Actions")) {
-    words.front().insert(0, "win.");
+  const std::string_view interface = sd_bus_message_get_interface(call);
+  if (interface == "org.gtk.Actions") words.front().insert(0, "win.");
+  if (interface == "org.gtk.Actions" || interface == "org.freedesktop.Application") {
     const std::string path = sd_bus_message_get_path(call);
     words.push_back("of " + path.substr(path.rfind('/') + 1));
   }
@@ -289,7 +290,7 @@ std::string talkLikeVlc(const std::string& line) {
   const std::string place = note("rc." + line);
   const bool paused = property("PlaybackStatus").value == "Paused";
   if (place.empty() || notes.contains("counts")) tell(0, "channel: " + line);
-  std::string reply = "status change: ( new input: file:///films/1/2.mkv )\r\n";
+  std::string reply = "status change: ( new input: 1/2.mkv )\r\n";
   if (!place.empty()) reply += paused ? "Press pause to continue.\r\n" : "Currently at " + place + ".\r\n";
   return reply + line + ": returned 0 (no error)\r\n";
 }

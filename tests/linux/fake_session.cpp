@@ -168,6 +168,7 @@ void beginSession() {
        {"HOME", "XDG_RUNTIME_DIR", "XDG_DATA_HOME", "XDG_DATA_DIRS", "XDG_CONFIG_HOME", "XDG_CONFIG_DIRS"}) {
     setenv(variable, directory.c_str(), 1);
   }
+  setenv("XDG_DATA_DIRS", (directory + "/none").c_str(), 1);
   for (const char* variable : {"DISPLAY", "WAYLAND_DISPLAY", "PULSE_SERVER"}) unsetenv(variable);
   setenv("DBUS_SESSION_BUS_ADDRESS", ("unix:path=" + directory + "/bus").c_str(), 1);
   std::ofstream(sDirectory / "bus.conf") << kBusConfiguration;

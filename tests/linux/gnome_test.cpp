@@ -119,11 +119,16 @@ TEST(Gnome, KeysGoThroughASessionThatMayEnd) {
   setenv("WAYLAND_DISPLAY", "none", 1);
   Shell shell;
   shell.tell = [](auto* answer) {
-    sd_bus_message_append(answer, "aa{sv}a(iiii)", 2, 2, "id", "u", 1, "is-active", "b", 1, 1, "id", "u", 2,
-                          0);
+    sd_bus_message_append(answer, "aa{sv}a(iiii)", 2, 3, "id", "u", 1, "is-active", "b", 1, "is-full-screen",
+                          "b", 1, 1, "id", "u", 2, 0);
   };
   kBackend.takeIn();
   const auto window = [](std::size_t which) { return kBackend.list().at(which).id.number; };
+  EXPECT_TRUE(kBackend.list()[0].isFullScreen && !kBackend.list()[0].isDialog);
+  windows::Window gone = kBackend.list()[0];
+  gone.id.number = 9;
+  kBackend.look({&gone, 1});
+  EXPECT_FALSE(gone.isFullScreen);
   EXPECT_FALSE(kBackend.sendKey(window(1), 'm', true, windows::kNoModifier)) << "it is not in front";
   EXPECT_TRUE(kBackend.sendKey(window(0), 'm', true, windows::kShift));
   EXPECT_TRUE(kBackend.sendKey(window(1), 'm', false, windows::kShift)) << "owed all the same";

@@ -53,3 +53,15 @@ tell Lyrabox to play
 audacious: answers
 tell Lyrabox to get player state
   = 'kPSP'
+# One that does not say what it does does not keep another from playing.
+audacious: paused
+player elisa silent holds=Get
+wait 2s
+tell Lyrabox to play
+  audacious: Play
+quit elisa
+# An action of one that is too busy to tell of it is done all the same.
+program eog holds=Describe
+window Photo of eog class=eog
+tell Snapvale to start slideshow
+  eog: SetState win.view-slideshow true of Photo

@@ -102,8 +102,13 @@ wait 0.75s
 release rewind
 press rewind
   rhythmbox: Pause
-tap stop
+tap play
 wait 0.5s
+press forward
+wait 0.25s
+  +0.25s  rhythmbox: SetPosition /track/1 177s
+release forward
+wait 1s
 quit rhythmbox
 
 # One that nobody knows, and that does not obey Play, gets PlayPause a second later, unless somebody else plays by then.
@@ -121,6 +126,12 @@ tap play
   newcomer: Play
 wait 0.5s
 mpv: playing
+wait 2s
+mpv: paused silent
+tell Lyrabox to play
+  newcomer: Play
+tell VistremePlayer to play front movie
+  mpv: Play
 wait 2s
 quit mpv
 quit newcomer
@@ -147,5 +158,44 @@ vlc: Position:s=soon PlaybackStatus:d=1 Metadata:s=none
 wait 1s
 tell Spindle to get elapsed time
   = 0
+tell Spindle to get dvd state
+  = 'esid'
+vlc: Tracks=/track/1,/track/2
 tell Spindle to get has media
-  = 0
+  = 1
+quit vlc
+# A length of nothing is none. What does not say that it can seek cannot, and neither can what is stopped.
+player audacious length=0s Position=1m playing
+press forward
+wait 0.25s
+  +0.25s  audacious: SetPosition /track/1 62s
+release forward
+wait 1s
+audacious: stopped
+tell Lyrabox to fast forward
+  fails
+audacious: CanSeek:s=yes Volume=1.5 playing
+tell Lyrabox to fast forward
+  fails
+tap previous
+  audacious: Previous
+tell Lyrabox to get sound volume
+  = 100
+# After a step nobody knows what it does, and it is asked.
+audacious: silent
+tap next
+  audacious: Next
+audacious: paused
+tap play
+  audacious: Play
+quit audacious
+# What one announces when its time is over is believed again.
+player audacious counts playing ignores=Pause
+  audacious: GetAll org.mpris.MediaPlayer2
+tell Lyrabox to pause
+  audacious: Get org.mpris.MediaPlayer2.Player PlaybackStatus
+  audacious: Pause
+wait 2s
+audacious: playing
+tell Lyrabox to get player state
+  = 'kPSP'

@@ -17,6 +17,7 @@ tap previous
 audacious: playing Position=1m
 wait 1s
 press forward
+tell Lyrabox to fast forward
 wait 0.5s
   +0.25s  audacious: SetPosition /track/1 62s
   +0.5s  audacious: SetPosition /track/1 64s
@@ -24,6 +25,11 @@ tell Lyrabox to get player state
   = 'kPSF'
 release forward
 wait 1s
+press forward
+tap next
+  audacious: Next
+wait 1s
+release forward
 # Backward it ends where the track begins, forward a second before its end, though the button is still down.
 audacious: Position=3s
 press rewind
@@ -62,6 +68,8 @@ release forward
 press rewind
 wait 0.25s
   +0.25s  audacious: SetPosition /track/2 14s
+tell Lyrabox to get player state
+  = 'kPSR'
 release rewind
 tell Lyrabox to get player state
   = 'kPSU'

@@ -29,6 +29,10 @@ tap next
   viewer: Activate win.slideshow-next-image of 1
 tap menu
   viewer: Activate win.slideshow-close of 1
+window Own of viewer class=gthumb
+front Own
+tap next
+  viewer: Activate win.slideshow-next-image of Own
 quit viewer
 # KDE's, whose methods step.
 program okular owns=org.kde.okular-$PID windows=okular__Shell_1

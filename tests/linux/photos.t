@@ -6,17 +6,21 @@ start
 tap play
   window Cat: activate
   eog: SetState win.view-slideshow true of Cat
+tell Snapvale to start slideshow
 tap next
   eog: Activate win.go-next of Cat
 tap menu
   eog: SetState win.view-slideshow false of Cat
+tell Snapvale to stop slideshow
+tell Snapvale to select album 8
+  fails
 # A display is captured by a shown window that covers most of it. Then play is a key, which pauses the show.
 eog: win.view-slideshow=false
 outputs 0,0,1280,720 1280,0,1920,1080
 window Cat full-screen area=1300,0,1500,1080
 tap play
   eog: Activate win.pause-slideshow of Cat
-window Cat area=1200,0,200,200
+window Cat area=1280,0,960,1080
 tap play
   window Cat: activate
   eog: SetState win.view-slideshow true of Cat
@@ -40,6 +44,10 @@ tell Snapvale to select album 7
 window Library full-screen
 tell Snapvale to select album 5
   window Library: key Left
+front Editor
+tell Snapvale to stop slideshow
+  window Library: key Escape
+front nobody
 # Where keys reach the active window alone, the others get none.
 window Library ordinary
 keys focused
@@ -49,6 +57,8 @@ front Editor
 tell Snapvale to select album 5
   window Editor: key Left
 keys any
+tell Keyhouse to key code 36 using command down
+  fails
 # Who was spoken to last goes before who came last.
 program gthumb
 window Album of gthumb class=gthumb
@@ -76,3 +86,5 @@ tap playpause
   window Shoot: key Return
 tap right
   window Shoot: key Right
+tell Keyhouse to key code 36 using option down
+  window Shoot: key Return

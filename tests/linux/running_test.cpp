@@ -1,4 +1,5 @@
-// Who is first for a role, how far a sound key goes, how long a button waits, and what comes too late.
+// Who is first for a role, how a program is started, how far a sound key goes, how long a button waits, and
+// what comes too late.
 
 #include "platform/linux/programs/running.h"
 
@@ -6,8 +7,14 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
+#include <filesystem>
+#include <fstream>
+#include <thread>
+
 #include "platform/base/service_directory.h"
+#include "platform/base/signal_set.h"
 #include "platform/linux/host/host.h"
+#include "platform/linux/programs/launch.h"
 #include "platform/linux/sound/sound_keys.h"
 #include "platform/linux/system/bus.h"
 #include "platform/linux/system/channel.h"
@@ -34,6 +41,26 @@ TEST(Running, ButtonStaysWithWhomItWasChosenFor) {
   EXPECT_EQ(programs::firstInstance(programs::Role::Jukebox)->serialNumber, chosen);
   EXPECT_NE(programs::rankedInstances(programs::Role::Jukebox).front()->serialNumber, chosen);
   host::finish();
+  fake::endSession();
+}
+
+TEST(Launch, WithoutAServiceManagerAProgramStandsOnItsOwn) {
+  fake::beginSession();
+  const TemporaryDirectory directory;
+  // Its session, its parent, the signals that it blocks.
+  std::ofstream(directory.path / "tell")
+      << "set -- $(cut -d' ' -f6 /proc/$$/stat) $PPID $(sed -n 's/^SigBlk:\\s*//p' /proc/$$/status)\n"
+      << "echo $(($1 == $$)) $(($2 == " << getpid() << ")) $3 >told~ && mv told~ told\n";
+  fake::writeEntry(
+      "player", {"Categories=AudioVideo;Audio;Player;", "Exec=sh tell", "Path=" + directory.path.string()});
+  const sigset_t blocked = base::signalSet({SIGUSR1});
+  sigprocmask(SIG_BLOCK, &blocked, nullptr);
+  programs::launchProgramOf(programs::Role::Jukebox);
+  while (!std::filesystem::exists(directory.path / "told")) std::this_thread::sleep_for(10ms);
+  std::string told;
+  std::getline(std::ifstream(directory.path / "told"), told);
+  EXPECT_EQ(told, "1 0 0000000000000000");
+  system::closeBus();
   fake::endSession();
 }
 

@@ -12,7 +12,15 @@ strawberry: playing
 tap play
   strawberry: Pause
   window Talk: key F5
+# Alone on the screen it is no show.
+window Palette of office class=soffice
+window Talk full-screen
+tell Slidewell to get playing
+  = 0
+close Palette
+window Talk ordinary
 window Show of office class=libreoffice-impress full-screen
+tell Slidewell to start slideshow
 tap next
   window Show: key Right
 press rewind
@@ -22,6 +30,8 @@ tap playpause
   window Show: key b
 tap playpause
   window Show: key b
+tell Slidewell to get frozen
+  = 0
 tap playpause
   window Show: key b
 tap next
@@ -38,6 +48,8 @@ tap playpause
   window Show: key b
 tap menu
   window Show: key Escape ×2
+tell Slidewell to get frozen
+  = 0
 # There is no show to end; the next one begins with its picture, and one that nobody sees is none.
 close Show
 tell Slidewell to stop slideshow
@@ -46,11 +58,18 @@ tap play
 window Show of office class=libreoffice-impress full-screen
 tap playpause
   window Show: key b
+tell Slidewell to set frozen to true
+close Show
+window Show of office class=libreoffice-impress full-screen
+tell Slidewell to get frozen
+  = 0
 window Show hidden
 tap play
   window Talk: key F5
 # The window is the same, but it is a sheet now.
 close Show
+tell Slidewell to get playing
+  = 0
 window Talk class=libreoffice-calc
 tap play
   strawberry: PlayPause

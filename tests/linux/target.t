@@ -75,7 +75,8 @@ front nobody
 tap play
   mpv: Play
 
-# Nobody runs: play starts the default player, once; nothing is started while the screen is locked.
+# Nobody runs: play starts the default player, once in twenty seconds, by the bus or the service manager; nothing is
+# started while the screen is locked.
 quit second
 quit mpv
 player third as=mpv.instance3 title=Film
@@ -91,11 +92,47 @@ quit third
 quit fourth
 quit vlc
 quit strawberry
-entry org.gnome.Music DBusActivatable=true
-program starter owns=org.gnome.Music
+entry org.strawberrymusicplayer.strawberry X-Kvd-Application=none
+entry Hi-Fi Categories=AudioVideo;Audio;Player;
+program manager owns=org.freedesktop.systemd1
+tap play
+  manager: StartTransientUnit app-kvd-Hi_Fi-86400000000000.service fail
+wait 19s
+tap play
+wait 1s
+tap play
+  manager: StartTransientUnit app-kvd-Hi_Fi-86420000000000.service fail
+wait 20s
+entry org.example.Hi-Fi Categories=AudioVideo;Audio;Player; DBusActivatable=true
+entry Hi-Fi X-Kvd-Application=none
+program starter owns=org.example.Hi-Fi
 lock on
 tap play
 lock off
 tap play
-  starter: Activate
+  starter: Activate of Hi_Fi
 tap play
+# What runs is not started again, and comes to the front; whoever was set something was spoken to.
+wait 20s
+player rhythmbox
+tell Lyrabox to launch
+player elisa
+tell Lyrabox to play
+  elisa: Play
+window Tune of rhythmbox class=rhythmbox
+front Tune
+tell Lyrabox to set sound volume to 50
+  rhythmbox: Set Volume 0.5
+elisa: paused
+front nobody
+tell Lyrabox to next track
+  rhythmbox: Next
+elisa: playing
+rhythmbox: playing
+tell Lyrabox to pause
+  elisa: Pause
+  rhythmbox: Pause
+quit elisa
+quit rhythmbox
+tell Lyrabox to activate
+  starter: Activate of Hi_Fi

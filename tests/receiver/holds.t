@@ -65,13 +65,13 @@ remote 3 hid
 6320 2 FASTFORWARD down
   6320 forward down
 6330 2 REWIND up
-6500 3 REWIND up
-  6340 rewind up
-  6500 rewind up
 
 # Whatever was down when a remote goes, comes up; a press that follows is a new one.
 6600 2 gone
+  6340 rewind up
   6600 forward up
+6605 3 REWIND up
+  6605 rewind up
 6600 2 REWIND down
   6600 rewind down
 6610 2 REWIND up

@@ -51,5 +51,5 @@ keys 5 STOP STOPCD FORWARD BACK UP ENTER ESC
   1000 left down
 1100 5 LEFT up 70050
 # On infrared it is the remote's own number.
-1200 2 UP down c00cd
+1200 2 UP down 1008c
   1200 menu-up down

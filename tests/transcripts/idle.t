@@ -8,6 +8,7 @@ start
   asks who is in front: nobody ×6
 wait 2h
   +10m to +2h  asks who is in front: nobody ×72
+lock on
 wait 9m
 wait 1m
   +1m  asks who is in front: nobody ×6
