@@ -67,8 +67,8 @@ Fate nextCall() {
 
 /// A name on the bus that never answers.
 const char* silentName() {
+  static sd_bus* silent = nullptr;
   static const char* const name = [] {
-    sd_bus* silent = nullptr;
     const char* unique = nullptr;
     if (sd_bus_open_user(&silent) < 0 || sd_bus_get_unique_name(silent, &unique) < 0) std::abort();
     return unique;
