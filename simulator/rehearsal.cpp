@@ -92,9 +92,10 @@ std::optional<std::string> misfortune(int process) {
 [[noreturn]] void play(const Rehearsal& rehearsal) {
   limitTime();
   const auto wait = [&](std::optional<base::Nanoseconds> deadline) {
-    if (stage::waitEnd()) return stage::letTimePass(deadline);
+    // Before time passes too: a scan that ends by itself may play on a while after a button.
     checkAtRest();
     if (brokenPromise()) end();
+    if (stage::waitEnd()) return stage::letTimePass(deadline);
     const std::optional<std::string> command = rehearsal.commands();
     if (!command) end();
     note(*command);
